@@ -1,0 +1,54 @@
+#ifndef VORL_FWD_H
+#define VORL_FWD_H
+
+/// @file
+/// Forward declarations of every public class.
+
+inline namespace vorl {
+
+class BaseClass;
+class ClassInfo;
+class DataBase;
+class HRTimer;
+class ILogging;
+class LogContext;
+class LogManager;
+class LogSession;
+class LogTarget;
+class LogThread;
+class OpBase;
+class dStatus;
+
+class BinaryDataIn;
+class BinaryDataOut;
+class IBinaryDataIO;
+
+class dBCGLUT;
+class dBuffer;
+class dCoordSys1D;
+class dCoordSys2D;
+class dCoordSys3D;
+class dImaDescriptorDIB;
+class dImage;
+class dLUT;
+class dPoint;
+class dRect;
+class dSlice;
+class dString;
+class dTrafo1D;
+class dTrafo2D;
+class dTrafo3D;
+class dUnitTrafo;
+class dVect2D;
+class dVect3D;
+class dVolume;
+class dWindowingLUT;
+
+class opLookup;
+class opMPR;
+class opMinMax;
+class opPixelRescale;
+
+}  // namespace vorl
+
+#endif
