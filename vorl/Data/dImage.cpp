@@ -1,0 +1,233 @@
+#include <vorl/Data/dImage.h>
+
+#include <cstring>
+
+#include <vorl/Common/LogContext.h>
+#include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Data/detail/ImageLayout.h>
+
+inline namespace vorl {
+
+using vorl_detail::ImageFormat;
+using vorl_detail::ImageFormatError;
+using vorl_detail::ImageLayout;
+
+VORL_REGISTER_CLASS(dImage, DataBase);
+
+dImage::dImage() {
+  dImage::Reset();
+  m_status.Set(-1, "not initialized");
+}
+
+dImage::dImage(const dImage& source) : DataBase(source), IBinaryDataIO(source) {
+  dImage::Reset();
+  *this = source;
+}
+
+dImage::~dImage() {
+  dImage::Reset();
+}
+
+void dImage::Reset() {
+  m_buffer.Delete();
+  m_rect.Reset();
+  m_numChannels = 0;
+  m_dataType = ImageDataType_U8;
+  m_dataOrder = ImageDataOrder_Pixel;
+  m_rowAlignment = 1;
+  m_pixelBits = 0;
+  m_channelOffset = 0;
+  m_columnOffset = 0;
+  m_rowOffset = 0;
+  m_channelOffsetBytes = 0;
+  m_channelSequence.clear();
+  OnReset();
+}
+
+bool dImage::IsValid() const {
+  return static_cast<bool>(m_buffer);
+}
+
+void dImage::OnInit() {}
+
+void dImage::OnReset() {}
+
+bool dImage::Fail(LogContext& context, int line) {
+  context.Status(line, m_status);
+  return false;
+}
+
+bool dImage::Init(unsigned long width, unsigned long height, unsigned short dataType,
+                  const char* channelSequence, unsigned short dataOrder,
+                  unsigned short rowAlignment) {
+  LogContext context("dImage::Init", __FILE__, __LINE__, true);
+  // Copied: the sequence may be this image's own, which a reset clears.
+  const std::string sequence = channelSequence != nullptr ? channelSequence : "";
+  ImageFormat format{width,     height,      dataType, ScanNumberOfChannels(sequence.c_str()),
+                     dataOrder, rowAlignment};
+  switch (vorl_detail::CheckImageFormat(format)) {
+    case ImageFormatError::None:
+      break;
+    case ImageFormatError::ChannelSequence:
+      Reset();
+      m_status.Set(false, "invalid 'ChannelSequence':'%s'", sequence.c_str());
+      return Fail(context, __LINE__);
+    case ImageFormatError::DataType:
+      Reset();
+      m_status.Set(false, "invalid 'DataType': %d", format.dataType);
+      return Fail(context, __LINE__);
+    case ImageFormatError::DataOrder:
+      Reset();
+      m_status.Set(false, "invalid 'DataOrder': %d", format.dataOrder);
+      return Fail(context, __LINE__);
+    case ImageFormatError::RowAlignment:
+      Reset();
+      m_status.Set(false, "invalid 'RowAlignment': %d", format.rowAlignment);
+      return Fail(context, __LINE__);
+  }
+  const ImageLayout layout(format);
+  if (!layout.FitsImage()) {
+    Reset();
+    m_status.Set(false, "no memory(%llu bytes required)",
+                 static_cast<unsigned long long>(layout.totalBytes));
+    return Fail(context, __LINE__);
+  }
+  if (layout.totalBytes != m_buffer.GetSize()) {
+    Reset();
+    if (AllocateDataBuffer(static_cast<unsigned long>(layout.totalBytes)) == nullptr) {
+      return m_status.IsOK();  // an image without pixels has no failure to report
+    }
+  }
+  SetLayout(layout);
+  m_channelSequence = sequence;
+  m_status = true;
+  OnInit();
+  return m_status.IsOK();
+}
+
+void dImage::SetLayout(const ImageLayout& layout) {
+  m_rect.Set(0, 0, static_cast<unsigned>(layout.format.width),
+             static_cast<unsigned>(layout.format.height));
+  m_numChannels = static_cast<std::uint16_t>(layout.format.numChannels);
+  m_dataType = layout.format.dataType;
+  m_dataOrder = layout.format.dataOrder;
+  m_rowAlignment = layout.format.rowAlignment;
+  m_pixelBits = static_cast<std::uint32_t>(layout.pixelBits);
+  m_channelOffset = static_cast<std::uint32_t>(layout.channelOffset);
+  m_columnOffset = m_pixelBits / 8;
+  m_rowOffset = static_cast<std::uint32_t>(layout.rowBytes);
+  m_channelOffsetBytes = m_channelOffset / 8;
+}
+
+bool dImage::Init(const dImage& model, unsigned long width, unsigned long height,
+                  unsigned short dataType) {
+  Init(width != 0 ? width : model.GetWidth(), height != 0 ? height : model.GetHeight(),
+       dataType != 0 ? dataType : model.GetDataType(), model.GetChannelSequence(),
+       model.GetDataOrder(), model.GetRowAlignment());
+  return m_status.IsOK();
+}
+
+void dImage::CopyLayout(const dImage& source) {
+  m_rect = source.m_rect;
+  m_numChannels = source.m_numChannels;
+  m_dataType = source.m_dataType;
+  m_dataOrder = source.m_dataOrder;
+  m_rowAlignment = source.m_rowAlignment;
+  m_pixelBits = source.m_pixelBits;
+  m_channelOffset = source.m_channelOffset;
+  m_channelSequence = source.m_channelSequence;
+  m_columnOffset = source.m_columnOffset;
+  m_rowOffset = source.m_rowOffset;
+  m_channelOffsetBytes = source.m_channelOffsetBytes;
+  m_status = source.m_status;
+}
+
+bool dImage::Init(DataTransferMode mode, dImage& source) {
+  LogContext context("dImage::Init", __FILE__, __LINE__, true);
+  if (this == &source) {
+    return IsValid();
+  }
+  Reset();
+  CopyLayout(source);
+  m_buffer.Init(source.m_buffer, mode);
+  if (mode == DTM_Copy && source.IsValid() && !IsValid()) {
+    Reset();
+    m_status.Set(false, "no memory(%lu bytes required)", source.GetImageSize());
+    return Fail(context, __LINE__);
+  }
+  OnInit();
+  if (mode == DTM_TakeOver) {
+    source.Reset();
+  }
+  return IsValid();
+}
+
+dImage& dImage::operator=(const dImage& source) {
+  if (this == &source) {
+    return *this;
+  }
+  if (!source.IsValid()) {
+    Reset();
+  } else if (Init(source, 0, 0, 0)) {
+    m_buffer = source.m_buffer;
+    m_status = source.m_status;
+  }
+  return *this;
+}
+
+void dImage::operator<<=(dImage& source) {
+  if (this == &source) {
+    return;
+  }
+  Reset();
+  CopyLayout(source);
+  m_buffer.Init(source.m_buffer, DTM_TakeOver);
+  OnInit();
+  source.Reset();
+}
+
+void dImage::operator>>=(dImage& destination) {
+  destination <<= *this;
+}
+
+bool dImage::Fill(char value) {
+  if (!IsValid()) {
+    return false;
+  }
+  std::memset(m_buffer.Get(0), static_cast<unsigned char>(value), m_buffer.GetSize());
+  return true;
+}
+
+bool dImage::CheckPixelAccess(int x, int y, int channel) {
+  LogContext context("dImage::CheckPixelAccess", __FILE__, __LINE__, true);
+  if (!IsValid()) {
+    m_status.Set(false, "uninitialized image object");
+    return Fail(context, __LINE__);
+  }
+  if (x < 0 || y < 0 || static_cast<unsigned>(x) >= m_rect.width ||
+      static_cast<unsigned>(y) >= m_rect.height) {
+    m_status.Set(false, "invalid pixel coordinates: %d/%d", x, y);
+    return Fail(context, __LINE__);
+  }
+  if (channel < 0 || channel >= m_numChannels) {
+    m_status.Set(false, "invalid channel index: %d", channel);
+    return Fail(context, __LINE__);
+  }
+  return true;
+}
+
+void* dImage::AllocateDataBuffer(unsigned long size) {
+  LogContext context("dImage::AllocateDataBuffer", __FILE__, __LINE__, true);
+  if (size == 0) {
+    return nullptr;
+  }
+  m_buffer.New(size, false);
+  if (!m_buffer) {
+    m_status.Set(false, "no memory(%lu bytes required)", size);
+    context.Status(__LINE__, m_status);
+    return nullptr;
+  }
+  return m_buffer.Get(0);
+}
+
+}  // namespace vorl

@@ -1,0 +1,46 @@
+#ifndef VORL_OPERATORS_IP_KERNELS_ROWLOOP_H
+#define VORL_OPERATORS_IP_KERNELS_ROWLOOP_H
+
+/// @file
+/// What every operator's loop over rows shares: it can be stopped, and it tells how far it is.
+
+#include <atomic>
+#include <cstddef>
+
+#include <vorl/Data/dImage.h>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+/// The two fields of an operator that its owner's thread shares.
+struct RunControl {
+  const std::atomic<bool>& stopRequested;
+  std::atomic<double>& progress;
+};
+
+/// Calls `row(i)` for i = 0 .. count - 1. A stop request is honoured before each row, progress
+/// stored once after each. Returns false when stopped.
+template <class Row>
+bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
+  for (std::size_t i = 0; i < count; ++i) {
+    if (control.stopRequested.load(std::memory_order_relaxed)) {
+      return false;
+    }
+    row(i);
+    control.progress.store(static_cast<double>(i + 1) / static_cast<double>(count),
+                           std::memory_order_relaxed);
+  }
+  return true;
+}
+
+/// Row `index` of an image, counted over all planes.
+template <class T>
+T* RowOf(const dImage& image, std::size_t index) {
+  return reinterpret_cast<T*>(static_cast<unsigned char*>(image.GetDataPtr()) +
+                              index * image.GetBytesPerRow());
+}
+
+}  // namespace vorl_detail
+}  // namespace vorl
+
+#endif

@@ -1,0 +1,172 @@
+// 1. Prepare checks the inputs.
+// 2. Process picks the worker for algorithm, data type and thickness.
+// 3. A worker carries the output plane into voxel coordinates (SlicePlane), looks at the volume's
+//    pixels through a validated view (VolumeView), and walks the output rows; each row is one call
+//    of a kernel (Mpr.h) with a sampler (Sampling.h).
+
+#include <vorl/Operators/IP/opMPR.h>
+
+#include <algorithm>
+#include <cstdlib>
+
+#include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/Mpr.h>
+#include <vorl/Operators/IP/kernels/RowLoop.h>
+#include <vorl/Operators/IP/kernels/SlicePlane.h>
+
+inline namespace vorl {
+
+using vorl_detail::FixedVector;
+using vorl_detail::NearestSampler;
+using vorl_detail::SlabSamples;
+using vorl_detail::TrilinearSampler;
+using vorl_detail::VolumeView;
+
+namespace {
+
+// The whole voxels that the slab crosses along its dominant axis.
+std::int32_t VoxelsAcross(const FixedVector& depth) {
+  const std::int64_t largest =
+      std::max({std::llabs(depth.x), std::llabs(depth.y), std::llabs(depth.z)});
+  return static_cast<std::int32_t>(largest >> 16);
+}
+
+SlabSamples SamplesAcross(const FixedVector& depth, std::int32_t depthSteps) {
+  const std::int32_t wanted = depthSteps < 0 ? VoxelsAcross(depth) : depthSteps;
+  const std::int32_t count = std::max(wanted, 2);
+  return {count, depth.DividedBy(count - 1)};
+}
+
+}  // namespace
+
+VORL_REGISTER_CLASS(opMPR, OpBase);
+
+opMPR::opMPR() {
+  opMPR::Reset();
+}
+
+opMPR::opMPR(const opMPR& source) = default;
+opMPR& opMPR::operator=(const opMPR& source) = default;
+
+opMPR::~opMPR() {
+  Terminate();
+  opMPR::Reset();
+}
+
+bool opMPR::Reset() {
+  mprSlice = nullptr;
+  volume = nullptr;
+  algoID = MPRAlgo_Nearest;
+  depthSteps = 0;
+  return true;
+}
+
+void opMPR::SelectAlgo(int id) {
+  algoID = id;
+}
+
+void opMPR::SetDepthSteps(int count) {
+  depthSteps = count;
+}
+
+bool opMPR::Prepare() {
+  if (volume == nullptr) {
+    m_status.Set(false, "missing input parameter 'Volume'");
+  } else if (!volume->IsValid()) {
+    m_status.Set(false, "given Volume is empty");
+  } else if (mprSlice == nullptr) {
+    m_status.Set(false, "missing input parameter 'MPR Slice'");
+  } else if (mprSlice->GetDataType() != volume->GetDataType()) {
+    m_status.Set(false, "incompatible data types(Volume: 0x%x, Slice: 0x%x", volume->GetDataType(),
+                 mprSlice->GetDataType());
+  } else {
+    m_status = true;
+    return !m_stopRequested;
+  }
+  return false;
+}
+
+bool opMPR::Process() {
+  if (algoID != MPRAlgo_Trilinear && algoID != MPRAlgo_Nearest) {
+    m_status.Set(false, "invalid MPR Algo ID: %d", algoID);
+    return false;
+  }
+  const unsigned short dataType = volume->GetDataType();
+  if (dataType != ImageDataType_U16 && dataType != ImageDataType_S16) {
+    m_status.Set(false, "unsupported data type: %d", dataType);
+    return false;
+  }
+  if (const auto invalid = VolumeView(*volume).FindInvalidSlice()) {
+    m_status.Set(false, "invalid pixel data in slice %d of the Volume", *invalid);
+    return false;
+  }
+  using Worker = bool (opMPR::*)(dVolume&, dSlice&);
+  static constexpr Worker kWorkers[2][2][2] = {
+      {{&opMPR::MPRThinNearestU16, &opMPR::MPRThickNearestU16},
+       {&opMPR::MPRThinTrilinearU16, &opMPR::MPRThickTrilinearU16}},
+      {{&opMPR::MPRThinNearestS16, &opMPR::MPRThickNearestS16},
+       {&opMPR::MPRThinTrilinearS16, &opMPR::MPRThickTrilinearS16}}};
+  const Worker worker = kWorkers[dataType == ImageDataType_S16 ? 1 : 0]
+                                [algoID == MPRAlgo_Trilinear ? 1 : 0][depthSteps != 0 ? 1 : 0];
+  (this->*worker)(*volume, *mprSlice);
+  return m_stopRequested ? Stopped() : true;
+}
+
+template <class T, class Sampler>
+bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
+  const VolumeView view(source);
+  const Sampler sampler(view);
+  // A slab is centred on the plane.
+  const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), thick ? -0.5 : 0.0);
+  const SlabSamples slab = SamplesAcross(plane.depthStep, depthSteps);
+  const dImage& image = target.GetImage();
+  const std::size_t width = image.GetWidth();
+  const FixedVector toNextRow =
+      plane.rowStep - plane.columnStep.Times(static_cast<std::int32_t>(image.GetWidth()));
+  FixedVector point = plane.start;
+  const auto row = [&](std::size_t index) {
+    T* pixels = vorl_detail::RowOf<T>(image, index);
+    if (thick) {
+      MprThickRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
+    } else {
+      MprThinRowRef(view, sampler, point, plane.columnStep, pixels, width);
+    }
+    point += toNextRow;
+  };
+  vorl_detail::ForEachRow({m_stopRequested, m_progress}, image.GetHeight(), row);
+  return true;
+}
+
+bool opMPR::MPRThinNearestU16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::uint16_t, NearestSampler<std::uint16_t>>(source, target, false);
+}
+
+bool opMPR::MPRThickNearestU16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::uint16_t, NearestSampler<std::uint16_t>>(source, target, true);
+}
+
+bool opMPR::MPRThinTrilinearU16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::uint16_t, TrilinearSampler<std::uint16_t>>(source, target, false);
+}
+
+bool opMPR::MPRThickTrilinearU16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::uint16_t, TrilinearSampler<std::uint16_t>>(source, target, true);
+}
+
+bool opMPR::MPRThinNearestS16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::int16_t, NearestSampler<std::int16_t>>(source, target, false);
+}
+
+bool opMPR::MPRThickNearestS16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::int16_t, NearestSampler<std::int16_t>>(source, target, true);
+}
+
+bool opMPR::MPRThinTrilinearS16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::int16_t, TrilinearSampler<std::int16_t>>(source, target, false);
+}
+
+bool opMPR::MPRThickTrilinearS16(dVolume& source, dSlice& target) {
+  return Reconstruct<std::int16_t, TrilinearSampler<std::int16_t>>(source, target, true);
+}
+
+}  // namespace vorl

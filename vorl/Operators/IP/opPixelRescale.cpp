@@ -1,0 +1,123 @@
+#include <vorl/Operators/IP/opPixelRescale.h>
+
+#include <vorl/Common/LogContext.h>
+#include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/Pixels.h>
+#include <vorl/Operators/IP/kernels/RowLoop.h>
+
+inline namespace vorl {
+
+VORL_REGISTER_CLASS(opPixelRescale, OpBase);
+
+opPixelRescale::opPixelRescale() {
+  opPixelRescale::Reset();
+}
+
+opPixelRescale::opPixelRescale(dImage* source, dImage* target, double factor, double offset) {
+  Run(source, target, factor, offset);
+}
+
+opPixelRescale::opPixelRescale(dImage* image, double factor, double offset)
+    : opPixelRescale(image, image, factor, offset) {}
+
+opPixelRescale::opPixelRescale(const opPixelRescale& source) = default;
+opPixelRescale& opPixelRescale::operator=(const opPixelRescale& source) = default;
+
+opPixelRescale::~opPixelRescale() {
+  Terminate();
+  opPixelRescale::Reset();
+}
+
+bool opPixelRescale::Reset() {
+  m_pSource = nullptr;
+  m_pTarget = nullptr;
+  m_factor = 1.0;
+  m_offset = 0.0;
+  return true;
+}
+
+bool opPixelRescale::Run(dImage* source, dImage* target, double factor, double offset) {
+  m_pSource = source;
+  m_pTarget = target;
+  m_factor = factor;
+  m_offset = offset;
+  return Run();
+}
+
+bool opPixelRescale::Prepare() {
+  LogContext context("opPixelRescale::Prepare", __FILE__, __LINE__, true);
+  if (m_pSource == nullptr) {
+    m_status.Set(false, "uninitialized parameter: m_pSource = null");
+    context.Status(__LINE__, m_status);
+    return false;
+  }
+  if (m_pTarget == nullptr) {
+    m_pTarget = m_pSource;
+  }
+  if (m_pTarget != m_pSource && !m_pTarget->Init(*m_pSource, 0, 0, 0)) {
+    m_status.Set(m_pTarget->GetStatus(), "error while initializing target image: ");
+    context.Status(__LINE__, m_status);
+    return false;
+  }
+  return true;
+}
+
+bool opPixelRescale::Process() {
+  LogContext context("opPixelRescale::Process", __FILE__, __LINE__, true);
+  if (m_factor == 1.0 && m_offset == 0.0) {
+    m_pTarget = m_pSource;
+    return true;
+  }
+  switch (m_pSource->GetDataType()) {
+    case ImageDataType_U8:
+      return RescaleU8(m_pSource, m_pTarget, m_factor, m_offset);
+    case ImageDataType_S8:
+      return RescaleS8(m_pSource, m_pTarget, m_factor, m_offset);
+    case ImageDataType_U16:
+      return RescaleU16(m_pSource, m_pTarget, m_factor, m_offset);
+    case ImageDataType_S16:
+      return RescaleS16(m_pSource, m_pTarget, m_factor, m_offset);
+    default:
+      m_status.Set(false, "unsupported pixel data type: %s",
+                   dImage::DataType2Str(m_pSource->GetDataType()));
+      context.Status(__LINE__, m_status);
+      return false;
+  }
+}
+
+template <class T>
+bool opPixelRescale::Rescale(dImage* source, dImage* target, double factor, double offset) {
+  if (source == nullptr || target == nullptr) {
+    return true;
+  }
+  const auto* from = static_cast<const T*>(source->GetDataPtr());
+  auto* to = static_cast<T*>(target->GetDataPtr());
+  if (from == nullptr || to == nullptr) {
+    return true;
+  }
+  // One dense run of samples, taken in pieces of a row's length so that it can be stopped.
+  const std::size_t length = source->GetDataSamplesInRow();
+  const auto row = [&](std::size_t index) {
+    vorl_detail::RescaleRunRef(from + index * length, to + index * length, length, factor, offset);
+  };
+  return vorl_detail::ForEachRow({m_stopRequested, m_progress}, source->GetNumRows(), row) ||
+         Stopped();
+}
+
+bool opPixelRescale::RescaleU8(dImage* source, dImage* target, double factor, double offset) {
+  return Rescale<std::uint8_t>(source, target, factor, offset);
+}
+
+bool opPixelRescale::RescaleS8(dImage* source, dImage* target, double factor, double offset) {
+  return Rescale<std::int8_t>(source, target, factor, offset);
+}
+
+bool opPixelRescale::RescaleU16(dImage* source, dImage* target, double factor, double offset) {
+  return Rescale<std::uint16_t>(source, target, factor, offset);
+}
+
+bool opPixelRescale::RescaleS16(dImage* source, dImage* target, double factor, double offset) {
+  return Rescale<std::int16_t>(source, target, factor, offset);
+}
+
+}  // namespace vorl
