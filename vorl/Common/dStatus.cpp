@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <limits>
 #include <new>
+#include <ostream>
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Common/detail/FormatText.h>
@@ -187,6 +188,10 @@ void dStatus::SetMsg(const char* format, ...) {
 void dStatus::AddMsg(const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
   m_message += text.data();
+}
+
+std::ostream& operator<<(std::ostream& out, const dStatus& status) {
+  return out << static_cast<long>(status) << ": " << static_cast<const char*>(status);
 }
 
 }  // namespace vorl

@@ -7,6 +7,7 @@
 #include <vorl/Common/BaseClass.h>
 
 #include <cstdarg>
+#include <iosfwd>
 #include <string>
 
 inline namespace vorl {
@@ -90,6 +91,9 @@ class VORL_API dStatus : public DataBase {
   std::int32_t m_code;
   std::string m_message;
 };
+
+/// Prints the code and the message, such as "-1: missing LUT".
+VORL_API std::ostream& operator<<(std::ostream& out, const dStatus& status);
 
 }  // namespace vorl
 

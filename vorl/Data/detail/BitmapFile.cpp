@@ -1,0 +1,66 @@
+#include <vorl/Data/detail/BitmapFile.h>
+
+#include <filesystem>
+#include <system_error>
+#include <utility>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+namespace fs = std::filesystem;
+
+namespace {
+
+std::FILE* OpenForWriting(const char* path) {
+  return std::fopen(path, "wb");
+}
+
+bool IsDevice(const char* path) {
+  std::error_code error;
+  return fs::is_character_file(path, error);
+}
+
+}  // namespace
+
+bool FileExists(const char* path) {
+  std::error_code error;
+  return fs::exists(path, error);
+}
+
+bool MakeRoomForFile(const char* path) {
+  std::error_code error;
+  if (IsDevice(path)) {
+    return true;
+  }
+  return fs::is_regular_file(path, error) && fs::remove(path, error);
+}
+
+BitmapFile::BitmapFile(const char* path) : m_path(path), m_file(OpenForWriting(path)) {}
+
+BitmapFile::~BitmapFile() {
+  if (m_file != nullptr) {
+    std::fclose(m_file);
+    std::error_code error;
+    if (fs::is_regular_file(m_path, error)) {
+      fs::remove(m_path, error);
+    }
+  }
+}
+
+bool BitmapFile::Write(const void* bytes, std::size_t count) {
+  return std::fwrite(bytes, 1, count, m_file) == count;
+}
+
+bool BitmapFile::Flush() {
+  return std::fflush(m_file) == 0;
+}
+
+bool BitmapFile::Finish() {
+  if (!Flush()) {
+    return false;
+  }
+  return std::fclose(std::exchange(m_file, nullptr)) == 0;
+}
+
+}  // namespace vorl_detail
+}  // namespace vorl

@@ -1,0 +1,50 @@
+#ifndef VORL_DATA_DETAIL_BITMAPFILE_H
+#define VORL_DATA_DETAIL_BITMAPFILE_H
+
+/// @file
+/// Writing a bitmap file piece by piece, and what becomes of a file that stood in its place.
+
+#include <cstddef>
+#include <cstdint>
+#include <cstdio>
+#include <string>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+/// Bytes of a bitmap row, which is a multiple of 32 bits long.
+inline std::uint64_t BitmapRowBytes(std::uint64_t width, unsigned bitsPerPixel) {
+  return (width * bitsPerPixel + 31) / 32 * 4;
+}
+
+bool FileExists(const char* path);
+
+/// Removes a file so that a new one can take its name. A device stays and is written to; a
+/// directory is not removed. False when the name is not free afterwards.
+bool MakeRoomForFile(const char* path);
+
+/// A file being written. Unless it is finished, what was created is removed again.
+class BitmapFile {
+ public:
+  explicit BitmapFile(const char* path);
+  BitmapFile(const BitmapFile&) = delete;
+  BitmapFile& operator=(const BitmapFile&) = delete;
+  ~BitmapFile();
+
+  bool IsOpen() const { return m_file != nullptr; }
+  /// Writes bytes; false when the system did not take them, which may show only later.
+  bool Write(const void* bytes, std::size_t count);
+  /// True when everything written so far has reached the system.
+  bool Flush();
+  /// Closes the file and keeps it; false when the system did not take all.
+  bool Finish();
+
+ private:
+  std::string m_path;
+  std::FILE* m_file;
+};
+
+}  // namespace vorl_detail
+}  // namespace vorl
+
+#endif
