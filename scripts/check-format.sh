@@ -19,7 +19,9 @@ case "${1:-}" in
   *) fail "unknown argument '$1'" ;;
 esac
 
-mapfile -t sources < <(git ls-files --cached --others --exclude-standard '*.h' '*.cpp')
-[ ${#sources[@]} -gt 0 ] || fail 'no sources found'
+# A clone may belong to another user than the one who checks it.
+list="$(git -c safe.directory="$PWD" ls-files --cached --others --exclude-standard '*.h' '*.cpp')"
+mapfile -t sources <<<"$list"
+[ -n "$list" ] || fail 'no sources found'
 step "Format of ${#sources[@]} sources"
 "$formatter" "${mode[@]}" "${sources[@]}"
