@@ -34,3 +34,10 @@ write_basic_package_version_file(${PROJECT_BINARY_DIR}/vorlConfigVersion.cmake
 install(FILES ${PROJECT_BINARY_DIR}/vorlConfig.cmake ${PROJECT_BINARY_DIR}/vorlConfigVersion.cmake
   DESTINATION ${package_dir} COMPONENT vorl_Development)
 install(FILES LICENSE DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT vorl_Development)
+
+if(TARGET vorl_cli)
+  install(TARGETS vorl_cli RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT vorl_Tools)
+  # The installed tool finds the library beside it, wherever both are moved.
+  file(RELATIVE_PATH library_path ${CMAKE_INSTALL_FULL_BINDIR} ${CMAKE_INSTALL_FULL_LIBDIR})
+  set_target_properties(vorl_cli PROPERTIES INSTALL_RPATH "$ORIGIN/${library_path}")
+endif()

@@ -35,5 +35,6 @@ done
 
 step 'Done. The pictures:'
 for plane in axial coronal sagittal oblique; do
+  [ -s "$output/$plane.png" ] || fail "$output/$plane.png was not written"
   printf '  %s\n' "$output/$plane.png"
 done
