@@ -15,11 +15,13 @@
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dBuffer.h>
 #include <vorl/Data/dCoordSys.h>
+#include <vorl/Data/dImaDescriptorDIB.h>
 #include <vorl/Data/dImage.h>
 #include <vorl/Data/dLUT.h>
 #include <vorl/Data/dPoint.h>
 #include <vorl/Data/dRect.h>
 #include <vorl/Data/dSlice.h>
+#include <vorl/Data/dString.h>
 #include <vorl/Data/dTrafo.h>
 #include <vorl/Data/dVect2D.h>
 #include <vorl/Data/dVect3D.h>
