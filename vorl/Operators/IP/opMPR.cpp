@@ -81,7 +81,7 @@ bool opMPR::Prepare() {
                  mprSlice->GetDataType());
   } else {
     m_status = true;
-    return !m_stopRequested;
+    return m_stopRequested ? Stopped() : true;
   }
   return false;
 }
