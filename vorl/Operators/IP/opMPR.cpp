@@ -10,6 +10,7 @@
 #include <cstdlib>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
 #include <vorl/Operators/IP/kernels/SlicePlane.h>
@@ -81,7 +82,7 @@ bool opMPR::Prepare() {
                  mprSlice->GetDataType());
   } else {
     m_status = true;
-    return !m_stopRequested;
+    return m_stopRequested ? Stopped() : true;
   }
   return false;
 }
@@ -98,6 +99,10 @@ bool opMPR::Process() {
   }
   if (const auto invalid = VolumeView(*volume).FindInvalidSlice()) {
     m_status.Set(false, "invalid pixel data in slice %d of the Volume", *invalid);
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(mprSlice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the MPR Slice");
     return false;
   }
   using Worker = bool (opMPR::*)(dVolume&, dSlice&);

@@ -1,5 +1,7 @@
 #include <vorl/Operators/IP/kernels/VolumeView.h>
 
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
+
 inline namespace vorl {
 namespace vorl_detail {
 
@@ -11,6 +13,12 @@ constexpr std::uint64_t kSampleBytes = 2;
 // the size, so nothing outside is ever read.
 std::int32_t LimitOf(std::int32_t size) {
   return WrapMultiply(size, 65536);
+}
+
+// Size and format; rows may be padded otherwise.
+bool IsLikeFirst(const dImage& image, const dImage& first) {
+  return image.GetWidth() == first.GetWidth() && image.GetHeight() == first.GetHeight() &&
+         image.GetFormatID() == first.GetFormatID();
 }
 
 }  // namespace
@@ -34,7 +42,8 @@ VolumeView::VolumeView(const dVolume& volume)
   m_slices.push_back(first.GetDataPtr());
   for (const dSlice& slice : slices) {
     const dImage& image = slice.GetImage();
-    if (!m_invalidSlice && (!image.IsValid() || image.GetImageSize() < neededBytes)) {
+    if (!m_invalidSlice &&
+        !(IsLikeFirst(image, first) && HoldsBytes(image, neededBytes, kSampleBytes))) {
       m_invalidSlice = static_cast<int>(m_slices.size()) - 1;
     }
     m_slices.push_back(image.GetDataPtr());
