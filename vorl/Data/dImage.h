@@ -114,8 +114,10 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// Writes rectangle, data type, data order, row alignment, channel sequence and pixels.
   void Write(BinaryDataOut& out) override;
   /// Reads what `Write` wrote. The position is not restored: a read image sits at (0, 0). A format
-  /// that asks for more bytes than the file still holds is a short read (-200); whenever reading
-  /// fails the image is left reset.
+  /// that asks for more bytes than the file still holds is a short read (-200), a format that
+  /// `Init` refuses fails with its status. Whenever reading fails the image is left reset, with the
+  /// status that is thrown. An empty image is read like any other, though `Init` reports that it
+  /// has no channels.
   void Read(BinaryDataIn& in) override;
 
   static dImage* Create();
