@@ -114,8 +114,11 @@ class VORL_API dBuffer : public DataBase {
   /// True when the buffer has data.
   operator bool() const;
 
- private:
+ protected:
+  /// True when `address` lies in the block that this buffer owns.
   bool OwnsAddress(const void* address) const;
+
+ private:
   void* Detach();
   void CopyBytes(const void* bytes, unsigned long size);
   void Refer(void* data, std::uint32_t size);
