@@ -194,10 +194,15 @@ class VORL_API BinaryDataOut : public BaseClass {
   [[noreturn]] void Error(long code, int line);
 
  private:
-  void WriteNumberItem(unsigned char tag, std::uint32_t value, unsigned long size);
-  void WriteCountedItem(unsigned char lengthTag, std::uint32_t value);
-  template <class File, class Element>
-  bool WriteElements(unsigned char tag, const Element* values, int count);
+  void WriteItem(unsigned char tag, const void* data, std::uint64_t size);
+  void WriteCount(unsigned char tagFamily, std::uint32_t count);
+  bool WriteByteArray(const void* bytes, std::uint64_t count);
+  template <class Number, class Element>
+  bool WriteNumber(unsigned char tag, Element value);
+  template <class Number, class Element>
+  bool WriteNumbers(unsigned char tag, const Element* values, int count);
+  template <class Number, class Element>
+  void WriteConverted(const Element* values, int count);
 
   dStatus m_status;
   std::shared_ptr<vorl_detail::ItemFile> m_file;
@@ -206,9 +211,9 @@ class VORL_API BinaryDataOut : public BaseClass {
 /// Reads a binary data file.
 ///
 /// Every reader returns true or throws its status (see the table above). A failed reader leaves the
-/// variable, string, buffer or array that it was to fill as it was, unless the file itself fails or
-/// shrinks while it is read. Lengths that the file states are compared with what the file still
-/// holds before anything is allocated. Only regular files can be read.
+/// variable, string, buffer or array that it was to fill as it was, unless memory is missing, or
+/// the file itself fails or shrinks while it is read. Lengths that the file states are compared
+/// with what the file still holds before anything is allocated. Only regular files can be read.
 ///
 /// Copies of a stream share its file and its position; the file is closed with the last one. A
 /// stream and its copies are used from one thread.
@@ -312,11 +317,14 @@ class VORL_API BinaryDataIn : public BaseClass {
  private:
   void ReadTag(unsigned char tag);
   void ReadBytes(void* data, std::uint64_t size);
-  std::uint32_t ReadCountedItem(unsigned char lengthTag, long code, int line);
-  template <class File, class Element>
-  bool ReadElement(unsigned char tag, Element& value);
-  template <class File, class Element>
-  bool ReadElements(unsigned char tag, Element* values, int count);
+  bool ReadCount(unsigned char tagFamily, std::uint32_t& count);
+  std::uint32_t ReadByteArrayHead();
+  template <class Number, class Element>
+  bool ReadNumber(unsigned char tag, Element& value);
+  template <class Number, class Element>
+  bool ReadNumbers(unsigned char tag, Element* values, int count);
+  template <class Number, class Element>
+  void ReadConverted(Element* values, int count);
 
   dStatus m_status;
   std::shared_ptr<vorl_detail::ItemFile> m_file;

@@ -1,0 +1,92 @@
+// Files beyond 2 GiB also where a plain offset has 32 bits; stands before every include.
+#define _FILE_OFFSET_BITS 64
+
+#include <vorl/Platform/detail/File.h>
+
+#include <sys/stat.h>
+#include <sys/types.h>
+
+#if defined(_WIN32)
+#include <io.h>
+#else
+#include <fcntl.h>
+#include <unistd.h>
+#endif
+
+inline namespace vorl {
+namespace vorl_detail {
+
+namespace {
+
+#if defined(_WIN32)
+using FileFacts = struct _stat64;
+
+bool AskFacts(std::FILE* file, FileFacts& facts) {
+  return _fstat64(_fileno(file), &facts) == 0;
+}
+#else
+using FileFacts = struct stat;
+
+bool AskFacts(std::FILE* file, FileFacts& facts) {
+  return fstat(fileno(file), &facts) == 0;
+}
+
+// Opens without waiting: an open of a pipe would otherwise last until its other end is opened.
+std::FILE* OpenWithoutWaiting(const char* name, int flags, const char* mode) {
+  const int descriptor = open(name, flags | O_NONBLOCK | O_NOCTTY | O_CLOEXEC, 0666);
+  if (descriptor < 0) {
+    return nullptr;
+  }
+  std::FILE* const file = fdopen(descriptor, mode);
+  if (file == nullptr) {
+    close(descriptor);
+    return nullptr;
+  }
+  fcntl(descriptor, F_SETFL, fcntl(descriptor, F_GETFL) & ~O_NONBLOCK);
+  return file;
+}
+#endif
+
+/// Closes the file unless it is of one of the two kinds.
+std::FILE* KeepIfOfKind(std::FILE* file, unsigned int kind, unsigned int otherKind) {
+  if (file == nullptr) {
+    return nullptr;
+  }
+  FileFacts facts{};
+  if (AskFacts(file, facts)) {
+    const unsigned int actual = facts.st_mode & static_cast<unsigned int>(S_IFMT);
+    if (actual == kind || actual == otherKind) {
+      return file;
+    }
+  }
+  std::fclose(file);
+  return nullptr;
+}
+
+}  // namespace
+
+std::FILE* OpenFileForReading(const char* name) {
+#if defined(_WIN32)
+  std::FILE* const file = std::fopen(name, "rb");
+#else
+  std::FILE* const file = OpenWithoutWaiting(name, O_RDONLY, "rb");
+#endif
+  return KeepIfOfKind(file, S_IFREG, S_IFREG);
+}
+
+std::FILE* OpenFileForWriting(const char* name) {
+#if defined(_WIN32)
+  std::FILE* const file = std::fopen(name, "wb");
+#else
+  std::FILE* const file = OpenWithoutWaiting(name, O_WRONLY | O_CREAT | O_TRUNC, "wb");
+#endif
+  return KeepIfOfKind(file, S_IFREG, S_IFCHR);
+}
+
+std::uint64_t FileSize(std::FILE* file) {
+  FileFacts facts{};
+  return AskFacts(file, facts) && facts.st_size > 0 ? static_cast<std::uint64_t>(facts.st_size) : 0;
+}
+
+}  // namespace vorl_detail
+}  // namespace vorl

@@ -1,0 +1,24 @@
+#ifndef VORL_PLATFORM_DETAIL_FILE_H
+#define VORL_PLATFORM_DETAIL_FILE_H
+
+#include <cstdint>
+#include <cstdio>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+/// Opens a regular file for binary reading. Null when there is none that may be read, and for
+/// everything that has no size to rely on: directories, pipes (never waits for a writer), devices.
+std::FILE* OpenFileForReading(const char* name);
+
+/// Creates or truncates a file for binary writing. Null when that is impossible, and for anything
+/// but regular files and character devices (never waits for the reader of a pipe).
+std::FILE* OpenFileForWriting(const char* name);
+
+/// The size of an open regular file in bytes; 0 when the system does not tell.
+std::uint64_t FileSize(std::FILE* file);
+
+}  // namespace vorl_detail
+}  // namespace vorl
+
+#endif
