@@ -1,0 +1,51 @@
+#include <cli/Interrupt.h>
+
+#include <csignal>
+
+#ifndef _WIN32
+#include <signal.h>
+#endif
+
+namespace cli {
+namespace {
+
+volatile std::sig_atomic_t g_interrupted = 0;
+
+extern "C" void OnInterrupt(int) {
+  g_interrupted = 1;
+}
+
+#ifndef _WIN32
+void Catch(int signal) {
+  struct sigaction action {};
+  if (sigaction(signal, nullptr, &action) != 0 || action.sa_handler == SIG_IGN)
+    return;
+  action = {};
+  action.sa_handler = OnInterrupt;
+  action.sa_flags = SA_RESTART;
+  sigemptyset(&action.sa_mask);
+  sigaction(signal, &action, nullptr);
+}
+#endif
+
+}  // namespace
+
+void CatchInterrupts() {
+#ifdef _WIN32
+  std::signal(SIGINT, OnInterrupt);
+  std::signal(SIGTERM, OnInterrupt);
+  std::signal(SIGBREAK, OnInterrupt);
+#else
+  Catch(SIGINT);
+  Catch(SIGTERM);
+  Catch(SIGHUP);
+  std::signal(SIGPIPE, SIG_IGN);
+  std::signal(SIGXFSZ, SIG_IGN);
+#endif
+}
+
+bool IsInterrupted() {
+  return g_interrupted != 0;
+}
+
+}  // namespace cli
