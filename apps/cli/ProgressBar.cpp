@@ -49,10 +49,13 @@ void Write(const std::string& text) {
 std::string ProgressText(double fraction, const std::string& what, int columns) {
   const double done = std::clamp(fraction, 0.0, 1.0);
   const auto filled = static_cast<std::size_t>(std::lround(done * kBarWidth));
-  char percent[16];
-  std::snprintf(percent, sizeof percent, "] %3ld%% ", std::lround(done * 100));
-  const std::string text = "[" + std::string(filled, '#') +
-                           std::string(std::size_t{kBarWidth} - filled, '-') + percent + what;
+  const std::string percent = std::to_string(std::lround(done * 100));
+  std::string text("[");
+  text.append(filled, '#');
+  text.append(std::size_t{kBarWidth} - filled, '-');
+  text.append("] ");
+  text.append(3 - std::min<std::size_t>(percent.size(), 3), ' ');
+  text.append(percent).append("% ").append(what);
   // The last column stays free: some terminals begin a new line behind it.
   return text.substr(0, static_cast<std::size_t>(std::max(columns - 1, 0)));
 }
@@ -67,7 +70,7 @@ void ProgressBar::Show(double fraction, const std::string& what) {
   if (text == m_shown)
     return;
   const std::size_t leftOver = m_shown.size() > text.size() ? m_shown.size() - text.size() : 0;
-  Write("\r" + text + std::string(leftOver, ' '));
+  Write(std::string(1, '\r').append(text).append(leftOver, ' '));
   m_shown = text;
   m_shownAt = now;
 }
@@ -75,7 +78,7 @@ void ProgressBar::Show(double fraction, const std::string& what) {
 void ProgressBar::Clear() {
   if (m_shown.empty())
     return;
-  Write("\r" + std::string(m_shown.size(), ' ') + "\r");
+  Write(std::string(1, '\r').append(m_shown.size(), ' ').append(1, '\r'));
   m_shown.clear();
 }
 
