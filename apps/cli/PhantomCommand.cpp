@@ -15,11 +15,10 @@ namespace {
 
 using study::DicomEncoding;
 
-constexpr std::array<std::pair<const char*, DicomEncoding>, 7> kEncodings{
+constexpr std::array<std::pair<const char*, DicomEncoding>, 6> kEncodings{
     {{"explicit", DicomEncoding::ExplicitLittle},
      {"implicit", DicomEncoding::ImplicitLittle},
      {"big-endian", DicomEncoding::ExplicitBig},
-     {"deflated", DicomEncoding::Deflated},
      {"rle", DicomEncoding::Rle},
      {"jpeg", DicomEncoding::JpegLossless},
      {"jpeg-ls", DicomEncoding::JpegLsLossless}}};
@@ -51,8 +50,8 @@ class PhantomCommand : public Command {
     AddText("--size", m_sizeText, "WxHxN",
             std::string("Voxels in each direction (default: ") + kPhantomSize + ")", "Phantom");
     AddText("--encoding", m_encodingText, "NAME",
-            "How the DICOM files are coded: explicit (default),\nimplicit, big-endian, deflated, "
-            "rle, jpeg, jpeg-ls;\nall keep every value",
+            "How the DICOM files are coded: explicit (default),\nimplicit, big-endian, rle,"
+            " jpeg, jpeg-ls;\nall keep every value",
             "Phantom");
   }
 

@@ -49,8 +49,8 @@ TEST_P(Interrupt, WhileAStudyIsWrittenLeavesTheEarlierFileOnly) {
   const TestFolder folder;
   const std::string path = (folder / "a.bdf").string();
   WriteBytes(path, "earlier");
-  const Outcome outcome = RunTool({"phantom", "--size", "200x200x200", path},
-                                  WhileWriting(folder.Path(), GetParam()));
+  const Outcome outcome =
+      RunTool({"phantom", "--size", "200x200x200", path}, WhileWriting(folder.Path(), GetParam()));
   EXPECT_EQ(outcome.code, 1);
   EXPECT_EQ(outcome.errors, "vorl: cancelled\n");
   EXPECT_EQ(folder.Names(), Names{"a.bdf"});

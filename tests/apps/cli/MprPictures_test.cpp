@@ -43,13 +43,13 @@ TEST_F(MprPictures, SagittalShowsTheHeadUpAndTheBackOnTheRight) {
   const Picture picture = CutPicture({kPhantom, "--plane", "sagittal", "--window", "soft"});
   ASSERT_EQ(picture.width, 100);
   ASSERT_EQ(picture.height, 80);
-  EXPECT_GT(picture.Mean(62, 10, 69, 70), 200);                                   // the spine
-  EXPECT_GT(picture.Mean(26, 12, 29, 35), picture.Mean(26, 55, 29, 75) + 50);     // the sternum
+  EXPECT_GT(picture.Mean(62, 10, 69, 70), 200);                                // the spine
+  EXPECT_GT(picture.Mean(26, 12, 29, 35), picture.Mean(26, 55, 29, 75) + 50);  // the sternum
 }
 
 TEST_F(MprPictures, APixelIsAsWideAsHigh) {
-  // The voxels are 4 x 4 x 4 mm in one phantom and 4 x 8 x 16 mm in the other: the pictures show the
-  // same 400 x 320 mm.
+  // The voxels are 4 x 4 x 4 mm in one phantom and 4 x 8 x 16 mm in the other: the pictures show
+  // the same 400 x 320 mm.
   const Picture fine = CutPicture({kPhantom, "--plane", "coronal"});
   const Picture coarse = CutPicture({"--phantom=100x50x20", "--plane", "coronal"});
   EXPECT_EQ(coarse.width, fine.width);
@@ -102,8 +102,9 @@ TEST_F(MprPictures, PictureAndSliceComeFromOneRun) {
 }
 
 TEST_F(MprPictures, ASavedSliceKeepsPlaceAndUnits) {
-  const auto slice = CutSlice({kPhantom, "--plane", "coronal", "--center", "10,20,30", "--size",
-                               "21x11", "--spacing", "2.5", "--thickness", "12", "--window", "lung"});
+  const auto slice =
+      CutSlice({kPhantom, "--plane", "coronal", "--center", "10,20,30", "--size", "21x11",
+                "--spacing", "2.5", "--thickness", "12", "--window", "lung"});
   EXPECT_EQ(slice->scale, 1);
   EXPECT_EQ(slice->offset, -1024);
   EXPECT_EQ(slice->unit, "HU");
@@ -118,8 +119,8 @@ TEST_F(MprPictures, ASavedSliceKeepsPlaceAndUnits) {
 }
 
 TEST_F(MprPictures, ASavedSliceCutAlongItselfIsItself) {
-  const auto slice = CutSlice({kPhantom, "--plane", "sagittal", "--center", "33,4,5", "--size",
-                               "31x41", "--spacing", "3"});
+  const auto slice = CutSlice(
+      {kPhantom, "--plane", "sagittal", "--center", "33,4,5", "--size", "31x41", "--spacing", "3"});
   const std::vector<std::uint16_t> samples = cli_test::SamplesOf(*slice);
   study_test::fs::rename(PathOf("slice.bdf"), PathOf("first.bdf"));
   const auto again = CutSlice({PathOf("first.bdf"), "--plane", "sagittal"});

@@ -61,8 +61,7 @@ TEST_F(MprPlanes, ObliqueIsAxialTurnedByThirtyAndTwentyDegrees) {
   const Point normal{plane.right[1] * plane.down[2] - plane.right[2] * plane.down[1],
                      plane.right[2] * plane.down[0] - plane.right[0] * plane.down[2],
                      plane.right[0] * plane.down[1] - plane.right[1] * plane.down[0]};
-  const double along =
-      normal[0] * m_middle[0] + normal[1] * m_middle[1] + normal[2] * m_middle[2];
+  const double along = normal[0] * m_middle[0] + normal[1] * m_middle[1] + normal[2] * m_middle[2];
   plane.centre = {normal[0] * along, normal[1] * along, normal[2] * along};
   ExpectCut(*CutSlice({kPhantom, "--plane", "oblique"}), m_phantom, plane, 0.02);
 }
@@ -72,10 +71,9 @@ TEST_F(MprPlanes, AllPlanesTakeCentreSizeSpacingAndRotation) {
     const char* name;
     PlaneModel plane;
   };
-  for (const Case& one : {Case{"axial", cli_test::AxialPlane()},
-                          Case{"coronal", cli_test::CoronalPlane()},
-                          Case{"sagittal", cli_test::SagittalPlane()},
-                          Case{"oblique", cli_test::AxialPlane()}}) {
+  for (const Case& one :
+       {Case{"axial", cli_test::AxialPlane()}, Case{"coronal", cli_test::CoronalPlane()},
+        Case{"sagittal", cli_test::SagittalPlane()}, Case{"oblique", cli_test::AxialPlane()}}) {
     SCOPED_TRACE(one.name);
     PlaneModel plane = one.plane.Turned(-12.5, 33, 71);
     plane.centre = {-20.3, 14.7, 31.9};
@@ -108,7 +106,8 @@ TEST_F(MprPlanes, EachAngleTurnsAboutItsOwnAxis) {
 }
 
 TEST_F(MprPlanes, AcquisitionsOfAnyDirectionAreShownTheSameWay) {
-  // Rows run to the head, columns to the right, slices to the front: nothing is as in the axial case.
+  // Rows run to the head, columns to the right, slices to the front: nothing is as in the axial
+  // case.
   VolumeModel volume;
   volume.size = {12, 15, 9};
   volume.firstVoxel = {30, 40, -50};
@@ -155,8 +154,8 @@ TEST_F(MprPlanes, APlaneBesideTheVolumeIsBlackAndNoted) {
 TEST_F(MprPlanes, APlaneThatReachesTooFarIsRefused) {
   // 30000 pixels of 60 mm on voxels of 50 mm: beyond the reach of the reconstruction.
   const cli_test::Outcome outcome =
-      cli_test::RunTool({"mpr", "--phantom=8x8x8", "--center", "1000000,0,0", "--size",
-                         "30000x2", "--spacing", "60", "-o", PathOf("x.png")});
+      cli_test::RunTool({"mpr", "--phantom=8x8x8", "--center", "1000000,0,0", "--size", "30000x2",
+                         "--spacing", "60", "-o", PathOf("x.png")});
   EXPECT_EQ(outcome.code, 1);
   EXPECT_EQ(outcome.errors, "vorl: the plane reaches more than 32767 voxels away\n");
   EXPECT_TRUE(m_folder.Names().empty());

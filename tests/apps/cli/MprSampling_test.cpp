@@ -29,8 +29,9 @@ class MprSampling : public CutFixture {
 
   /// The arguments for the axial plane of `m_plane`, and more.
   Arguments PlaneArguments(const Arguments& more) const {
-    Arguments arguments{PathOf("volume.bdf"), "--center", cli_test::TripleText(m_plane.centre),
-                        "--size", "40x36", "--spacing", "0.7"};
+    Arguments arguments{
+        PathOf("volume.bdf"), "--center", cli_test::TripleText(m_plane.centre), "--size", "40x36",
+        "--spacing",          "0.7"};
     arguments.insert(arguments.end(), more.begin(), more.end());
     return arguments;
   }
@@ -66,18 +67,17 @@ TEST_F(MprSampling, SlabsAreTurnedWithTheirPlane) {
   PlaneModel plane = m_plane.Turned(40, -25, 10);
   plane.thickness = 9;
   plane.steps = 7;
-  ExpectCut(*CutSlice(PlaneArguments(
-                {"--thickness", "9", "--steps", "7", "--rotate", "40,-25,10"})),
-            m_volume, plane, 0.1);
+  ExpectCut(
+      *CutSlice(PlaneArguments({"--thickness", "9", "--steps", "7", "--rotate", "40,-25,10"})),
+      m_volume, plane, 0.1);
 }
 
 TEST_F(MprSampling, LinearRunsEvenlyFromVoxelCentreToVoxelCentre) {
   // Constant in each slice, 100 more from slice to slice: 50 per millimetre, 0 at z = 0.
   m_volume.stored = [](int, int, int k) { return 100 * k; };
   cli_test::WriteVolume(m_volume, PathOf("ramp.bdf"));
-  const auto slice =
-      CutSlice({PathOf("ramp.bdf"), "--plane", "coronal", "--filter", "linear", "--center",
-                "9.3,8.1,23", "--size", "3x160", "--spacing", "0.25"});
+  const auto slice = CutSlice({PathOf("ramp.bdf"), "--plane", "coronal", "--filter", "linear",
+                               "--center", "9.3,8.1,23", "--size", "3x160", "--spacing", "0.25"});
   const std::vector<std::uint16_t> samples = SamplesOf(*slice);
   ASSERT_EQ(samples.size(), 480u);
   for (int y = 0; y < 160; ++y) {
@@ -91,9 +91,8 @@ TEST_F(MprSampling, LinearAndNearestShowAThingAtTheSamePlace) {
   m_volume.stored = [](int, int, int k) { return k == 12 ? 1000 : 0; };
   cli_test::WriteVolume(m_volume, PathOf("slab.bdf"));
   const auto middleOf = [&](const char* filter) {
-    const auto slice =
-        CutSlice({PathOf("slab.bdf"), "--plane", "sagittal", "--filter", filter, "--center",
-                  "9.3,8.1,23", "--size", "1x160", "--spacing", "0.25"});
+    const auto slice = CutSlice({PathOf("slab.bdf"), "--plane", "sagittal", "--filter", filter,
+                                 "--center", "9.3,8.1,23", "--size", "1x160", "--spacing", "0.25"});
     double sum = 0;
     double moment = 0;
     double y = 0;

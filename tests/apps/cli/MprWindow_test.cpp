@@ -184,9 +184,9 @@ TEST_F(MprWindow, BrightnessContrastAndGammaBendTheLevelsInsideTheWindow) {
 
 TEST_F(MprWindow, NeutralLevelsLeaveTheWindowExact) {
   WriteRamp(1);
-  EXPECT_EQ(LevelsWith({"--window", "1000,3000", "--brightness", "0", "--contrast", "0", "--gamma",
-                        "1"}),
-            ExpectedLevels(1000, 3000, 1));
+  EXPECT_EQ(
+      LevelsWith({"--window", "1000,3000", "--brightness", "0", "--contrast", "0", "--gamma", "1"}),
+      ExpectedLevels(1000, 3000, 1));
 }
 
 TEST_F(MprWindow, APresetForOtherUnitsIsNoted) {
@@ -199,9 +199,10 @@ TEST_F(MprWindow, APresetForOtherUnitsIsNoted) {
             "vorl: note: the window 'bone' is meant for Hounsfield units, the values are in no "
             "unit\n");
   WriteRamp(1);
-  EXPECT_EQ(cli_test::RunTool({"mpr", PathOf("ramp.bdf"), "-o", PathOf("a.png"), "--window", "bone"})
-                .errors,
-            "");
+  EXPECT_EQ(
+      cli_test::RunTool({"mpr", PathOf("ramp.bdf"), "-o", PathOf("a.png"), "--window", "bone"})
+          .errors,
+      "");
 }
 
 }  // namespace

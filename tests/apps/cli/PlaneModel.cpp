@@ -8,7 +8,9 @@ namespace {
 
 constexpr double kBorder = 1e-3;
 
-double Dot(const Point& a, const Point& b) { return a[0] * b[0] + a[1] * b[1] + a[2] * b[2]; }
+double Dot(const Point& a, const Point& b) {
+  return a[0] * b[0] + a[1] * b[1] + a[2] * b[2];
+}
 
 Point Cross(const Point& a, const Point& b) {
   return {a[1] * b[2] - a[2] * b[1], a[2] * b[0] - a[0] * b[2], a[0] * b[1] - a[1] * b[0]};

@@ -101,8 +101,7 @@ TEST(Progress, QuietAndDumbTerminalsShowNoBar) {
 TEST(Progress, ErrorsStandOnALineOfTheirOwn) {
   const Outcome outcome = RunTool({"convert", "--phantom=32x32x32", "/dev/full"}, Terminal(80));
   EXPECT_EQ(outcome.code, 1);
-  EXPECT_EQ(Visible(outcome.errors),
-            "vorl: can't write '/dev/full': No space left on device\n");
+  EXPECT_EQ(Visible(outcome.errors), "vorl: can't write '/dev/full': No space left on device\n");
 }
 
 }  // namespace

@@ -26,7 +26,9 @@ using cli_test::VolumeModel;
 
 constexpr double kSpacing = 0.451171875;
 
-std::string Folder() { return VORL_TEST_DATA "/ct-a"; }
+std::string Folder() {
+  return VORL_TEST_DATA "/ct-a";
+}
 
 /// The samples straight from the files, by slice position.
 const std::vector<std::vector<Uint16>>& Slices() {
@@ -39,8 +41,7 @@ const std::vector<std::vector<Uint16>>& Slices() {
       EXPECT_TRUE(file.getDataset()->findAndGetFloat64(DCM_ImagePositionPatient, z, 2).good());
       const Uint16* samples = nullptr;
       unsigned long count = 0;
-      EXPECT_TRUE(
-          file.getDataset()->findAndGetUint16Array(DCM_PixelData, samples, &count).good());
+      EXPECT_TRUE(file.getDataset()->findAndGetUint16Array(DCM_PixelData, samples, &count).good());
       sorted[z].assign(samples, samples + count);
     }
     std::vector<std::vector<Uint16>> list;
@@ -65,9 +66,7 @@ class RealSeries : public CutFixture {
   }
 
   /// The centre of the middle voxel (256, 256, 48).
-  Point Middle() const {
-    return {-115.5 + 256 * kSpacing, -1.85 + 256 * kSpacing, 724.21 + 48};
-  }
+  Point Middle() const { return {-115.5 + 256 * kSpacing, -1.85 + 256 * kSpacing, 724.21 + 48}; }
   /// The middle between the outermost voxel borders.
   Point Centre() const {
     return {-115.5 + 255.5 * kSpacing, -1.85 + 255.5 * kSpacing, 724.21 + 47.5};

@@ -83,8 +83,7 @@ bool ReadSome(int file, std::string& text) {
 }
 
 /// Reads both channels until they end; sends the signal when its time has come.
-void Attend(pid_t process, const Conditions& conditions, int output, int errors,
-            Outcome& outcome) {
+void Attend(pid_t process, const Conditions& conditions, int output, int errors, Outcome& outcome) {
   std::array<pollfd, 2> files{pollfd{output, POLLIN, 0}, pollfd{errors, POLLIN, 0}};
   const Clock::time_point end = Clock::now() + kLongestRun;
   bool signalled = !conditions.when;

@@ -22,12 +22,12 @@ struct Outcome {
 
 /// What a run meets. Without anything else, standard output and error are pipes.
 struct Conditions {
-  int terminalColumns = 0;               ///< more than 0: a terminal of this width instead of pipes
-  std::string terminalKind = "xterm";    ///< TERM on a terminal
-  std::string standardOutput;            ///< a file to be opened instead of a pipe
-  long largestFile = -1;                 ///< bytes that a file may grow to; negative: no limit
-  bool interruptsIgnored = false;        ///< as for a background job of a script
-  int signal = SIGINT;                   ///< sent once `when` holds
+  int terminalColumns = 0;             ///< more than 0: a terminal of this width instead of pipes
+  std::string terminalKind = "xterm";  ///< TERM on a terminal
+  std::string standardOutput;          ///< a file to be opened instead of a pipe
+  long largestFile = -1;               ///< bytes that a file may grow to; negative: no limit
+  bool interruptsIgnored = false;      ///< as for a background job of a script
+  int signal = SIGINT;                 ///< sent once `when` holds
   std::function<bool(const Outcome& soFar)> when;
 };
 
