@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <limits>
 #include <memory>
+#include <sstream>
 #include <string>
 #include <type_traits>
 
@@ -247,6 +248,12 @@ TEST(dStatus, VirtualFunctionsAreThoseOfDataBase) {
   EXPECT_EQ(VirtualSlot(&dStatus::Reset), 4u);
   EXPECT_EQ(VirtualSlot(&dStatus::IsValid), 5u);
   EXPECT_TRUE(std::has_virtual_destructor_v<dStatus>);
+}
+
+TEST(dStatus, PrintsCodeAndText) {
+  std::ostringstream out;
+  out << dStatus(-1, "missing LUT") << '|' << dStatus(true, "");
+  EXPECT_EQ(out.str(), "-1: missing LUT|0: ");
 }
 
 // The binary streams throw their status.
