@@ -18,6 +18,8 @@ namespace {
 
 namespace fs = std::filesystem;
 
+constexpr int kLeastJpegLsPixels = 1024;
+
 /// A number as a decimal string of at most 16 characters.
 std::string Decimal(double value) {
   char text[32];
@@ -167,6 +169,16 @@ void PutPixels(DcmItem& item, const Series& series, const dSlice& slice, int ind
   }
 }
 
+/// The toolkit's JPEG-LS encoder writes beyond its buffer, which is measured by the plain picture,
+/// when that is smaller than the stream's own headers.
+void CheckEncoder(const Study& study, const DicomWriteOptions& options) {
+  const int pixels = study.volume.GetSizeX() * study.volume.GetSizeY();
+  if (options.encoding == DicomEncoding::JpegLsLossless && pixels < kLeastJpegLsPixels) {
+    throw Error("slices of less than " + std::to_string(kLeastJpegLsPixels) +
+                " pixels can't be written as JPEG-LS");
+  }
+}
+
 struct Syntax {
   E_TransferSyntax syntax;
   std::unique_ptr<DcmRepresentationParameter> parameter;
@@ -180,8 +192,6 @@ Syntax SyntaxOf(DicomEncoding encoding) {
       return {EXS_LittleEndianImplicit, nullptr};
     case DicomEncoding::ExplicitBig:
       return {EXS_BigEndianExplicit, nullptr};
-    case DicomEncoding::Deflated:
-      return {EXS_DeflatedLittleEndianExplicit, nullptr};
     case DicomEncoding::Rle:
       return {EXS_RLELossless, nullptr};
     case DicomEncoding::JpegLossless:
@@ -273,6 +283,7 @@ void CheckWritable(const Study& study, const DicomWriteOptions& options) {
     throw Error("the study is empty");
   }
   FormatOf(options);
+  CheckEncoder(study, options);
   const auto count = static_cast<std::size_t>(study.volume.GetSliceCount());
   if (!options.sliceSlopes.empty() && options.sliceSlopes.size() != count) {
     throw Error("the number of slopes is not that of the slices");

@@ -18,7 +18,6 @@ enum class DicomEncoding {
   ExplicitLittle,
   ImplicitLittle,
   ExplicitBig,
-  Deflated,
   Rle,
   JpegLossless,
   JpegLsLossless

@@ -7,6 +7,8 @@
 namespace study {
 namespace {
 
+constexpr double kFarthestMm = 1e6;
+
 struct Axes {
   Vec3 origin, x, y, z;
 };
@@ -31,13 +33,15 @@ std::string PlacementProblem(const dCoordSys3D& coordinates) {
   if (!IsFinite(axes.origin) || !IsFinite(axes.x) || !IsFinite(axes.y) || !IsFinite(axes.z)) {
     return "the position of the volume is not finite";
   }
-  const double volume = std::abs(Determinant(axes));
-  if (!std::isfinite(volume)) {
-    return "the voxels are too large";
+  for (const Vec3& v : {axes.origin, axes.x, axes.y, axes.z}) {
+    if (Length(v) > kFarthestMm) {
+      return "the volume reaches beyond a kilometre";
+    }
   }
+  const double volume = std::abs(Determinant(axes));
   // The library's limit is 1e-6 on numbers in single precision; keep clear of its rounding.
   if (volume <= 1.001e-6) {
-    return "the voxels are too small or flat (at least 0.00001 cubic millimetres are needed)";
+    return "the voxels are too small or flat (more than 0.000001 cubic millimetres are needed)";
   }
   return {};
 }

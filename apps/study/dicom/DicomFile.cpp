@@ -1,11 +1,28 @@
+#include <dcmtk/config/osconfig.h>
+
+#include <dcmtk/dcmdata/dcpixseq.h>
+#include <dcmtk/dcmdata/dcpxitem.h>
 #include <study/Error.h>
 #include <study/dicom/Codecs.h>
 #include <study/dicom/DicomFile.h>
+#include <study/dicom/Structure.h>
 
 #include <cstring>
 #include <fstream>
 
 namespace study {
+namespace {
+
+std::string SyntaxText(E_TransferSyntax syntax, const std::string& uid) {
+  std::string shown;
+  for (const char c : uid.substr(0, 64)) {
+    shown += c >= 0x20 && c < 0x7F ? c : '?';
+  }
+  return Quoted(syntax == EXS_Unknown ? "unknown" : DcmXfer(syntax).getXferName()) + " (" + shown +
+         ")";
+}
+
+}  // namespace
 
 bool LooksLikeDicom(const std::filesystem::path& path) {
   char head[132] = {};
@@ -16,6 +33,12 @@ bool LooksLikeDicom(const std::filesystem::path& path) {
 
 std::unique_ptr<DcmFileFormat> OpenDicom(const std::filesystem::path& path) {
   RegisterDicomCodecs();
+  const std::string syntax = CheckStructure(path);
+  const E_TransferSyntax known = DcmXfer(syntax.c_str()).getXfer();
+  // A compressed data set could hold anything: it cannot be looked through before it is parsed.
+  if (!syntax.empty() && (known == EXS_Unknown || known == EXS_DeflatedLittleEndianExplicit)) {
+    throw Error("its transfer syntax " + SyntaxText(known, syntax) + " is not supported");
+  }
   auto file = std::make_unique<DcmFileFormat>();
   const OFCondition condition = file->loadFile(OFFilename(path.c_str()), EXS_Unknown, EGL_noChange,
                                                DCM_MaxReadLength, ERM_fileOnly);
@@ -29,8 +52,8 @@ std::unique_ptr<DcmFileFormat> OpenDicom(const std::filesystem::path& path) {
 }
 
 std::string TransferSyntaxText(DcmDataset& dataset) {
-  const DcmXfer syntax(dataset.getOriginalXfer());
-  return Quoted(syntax.getXferName()) + " (" + syntax.getXferID() + ")";
+  const E_TransferSyntax syntax = dataset.getOriginalXfer();
+  return SyntaxText(syntax, DcmXfer(syntax).getXferID());
 }
 
 bool CanDecode(E_TransferSyntax syntax) {
@@ -38,7 +61,6 @@ bool CanDecode(E_TransferSyntax syntax) {
     case EXS_LittleEndianImplicit:
     case EXS_LittleEndianExplicit:
     case EXS_BigEndianExplicit:
-    case EXS_DeflatedLittleEndianExplicit:
     case EXS_RLELossless:
     case EXS_JPEGProcess1:
     case EXS_JPEGProcess2_4:
@@ -52,6 +74,39 @@ bool CanDecode(E_TransferSyntax syntax) {
     default:
       return false;
   }
+}
+
+DcmPixelSequence* FragmentsOf(DcmDataset& dataset) {
+  DcmElement* element = nullptr;
+  dataset.findAndGetElement(DCM_PixelData, element);
+  auto* pixels = dynamic_cast<DcmPixelData*>(element);
+  if (pixels == nullptr) {
+    return nullptr;
+  }
+  E_TransferSyntax syntax = EXS_Unknown;
+  const DcmRepresentationParameter* parameter = nullptr;
+  DcmPixelSequence* fragments = nullptr;
+  pixels->getOriginalRepresentationKey(syntax, parameter);
+  const bool found = pixels->getEncapsulatedRepresentation(syntax, parameter, fragments).good();
+  return found ? fragments : nullptr;
+}
+
+std::uint64_t PixelBytesInFile(DcmDataset& dataset) {
+  DcmPixelSequence* fragments = FragmentsOf(dataset);
+  DcmElement* element = nullptr;
+  if (fragments == nullptr) {
+    dataset.findAndGetElement(DCM_PixelData, element);
+    return element == nullptr ? 0 : element->getLength();
+  }
+  std::uint64_t total = 0;
+  // The first item is a table of offsets.
+  for (unsigned long i = 1; i < fragments->card(); ++i) {
+    DcmPixelItem* item = nullptr;
+    if (fragments->getItem(item, i).good() && item != nullptr) {
+      total += item->getLength();
+    }
+  }
+  return total;
 }
 
 }  // namespace study

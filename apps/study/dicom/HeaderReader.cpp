@@ -212,7 +212,7 @@ std::vector<SliceHeader> ReadSliceHeaders(const std::filesystem::path& path,
   DcmDataset& dataset = *file->getDataset();
   const Attributes data({&dataset});
   identity.seriesUid = data.Text(DCM_SeriesInstanceUID);
-  if (!data.Has(DCM_PixelData)) {
+  if (PixelBytesInFile(dataset) == 0) {
     throw Error("it holds no pixel data");
   }
   CheckGrey(data);

@@ -4,6 +4,7 @@
 #include <dcmtk/dcmdata/dcpxitem.h>
 #include <study/Error.h>
 #include <study/dicom/DicomFile.h>
+#include <study/dicom/JpegHeader.h>
 #include <study/dicom/Samples.h>
 #include <study/dicom/SliceReader.h>
 
@@ -32,37 +33,57 @@ DcmPixelData& PixelDataOf(DcmDataset& dataset) {
   return *pixels;
 }
 
-/// The bytes of all fragments of encapsulated pixel data.
-std::uint64_t EncapsulatedBytes(DcmPixelData& pixels) {
-  E_TransferSyntax syntax = EXS_Unknown;
-  const DcmRepresentationParameter* parameter = nullptr;
-  DcmPixelSequence* sequence = nullptr;
-  pixels.getOriginalRepresentationKey(syntax, parameter);
-  if (pixels.getEncapsulatedRepresentation(syntax, parameter, sequence).bad() ||
-      sequence == nullptr) {
+/// Appends the bytes of one fragment.
+void AppendFragment(DcmPixelSequence& fragments, unsigned long index,
+                    std::vector<std::uint8_t>& bytes) {
+  DcmPixelItem* item = nullptr;
+  Uint8* data = nullptr;
+  if (fragments.getItem(item, index).bad() || item == nullptr || item->getUint8Array(data).bad() ||
+      data == nullptr) {
     throw Error("its compressed pixel data is damaged");
   }
-  std::uint64_t total = 0;
-  for (unsigned long i = 0; i < sequence->card(); ++i) {
-    DcmPixelItem* item = nullptr;
-    if (sequence->getItem(item, i).good() && item != nullptr) {
-      total += item->getLength();
-    }
+  bytes.insert(bytes.end(), data, data + item->getLength());
+}
+
+/// The streams of JPEG frames: each frame is a fragment, or all fragments are one frame.
+void CheckJpegStreams(DcmPixelSequence& fragments, std::uint32_t frames,
+                      const SliceHeader& header) {
+  const unsigned long count = fragments.card();
+  if (count < 2 || (frames > 1 && count != frames + 1)) {
+    throw Error("its compressed pixel data is not one fragment per frame");
   }
-  return total;
+  std::vector<std::uint8_t> stream;
+  for (unsigned long i = 1; i < count; ++i) {
+    AppendFragment(fragments, i, stream);
+    if (frames == 1 && i + 1 < count) {
+      continue;
+    }
+    const std::string problem = JpegHeaderProblem(stream, header.grid.columns, header.grid.rows,
+                                                  header.format.bitsAllocated);
+    if (!problem.empty()) {
+      throw Error("its compressed pixel data is damaged (" + problem + ")");
+    }
+    stream.clear();
+  }
 }
 
 /// Replaces compressed pixels by plain ones. Every frame is decoded.
 void Decode(DcmDataset& dataset, const SliceHeader& header) {
-  DcmPixelData& pixels = PixelDataOf(dataset);
-  Sint32 frames = 1;
-  dataset.findAndGetSint32(DCM_NumberOfFrames, frames);
-  const std::uint64_t expected =
-      FrameBytes(header.grid, header.format) * static_cast<std::uint64_t>(std::max(frames, 1));
-  const std::uint64_t present = EncapsulatedBytes(pixels);
+  DcmPixelSequence* fragments = FragmentsOf(dataset);
+  if (fragments == nullptr) {
+    throw Error("its compressed pixel data is damaged");
+  }
+  Sint32 announced = 1;
+  dataset.findAndGetSint32(DCM_NumberOfFrames, announced);
+  const auto frames = static_cast<std::uint32_t>(std::max<Sint32>(announced, 1));
+  const std::uint64_t expected = FrameBytes(header.grid, header.format) * frames;
+  const std::uint64_t present = PixelBytesInFile(dataset);
   if (expected > kHarmlessBytes && expected / kLargestExpansion > present) {
     throw Error("its compressed pixel data is too short: " + std::to_string(present) +
                 " bytes for an image of " + std::to_string(expected));
+  }
+  if (dataset.getOriginalXfer() != EXS_RLELossless) {
+    CheckJpegStreams(*fragments, frames, header);
   }
   const OFCondition condition = dataset.chooseRepresentation(EXS_LittleEndianExplicit, nullptr);
   if (condition.bad()) {

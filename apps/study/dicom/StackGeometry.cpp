@@ -39,8 +39,9 @@ Vec3 AnnouncedStep(const SliceHeader& header) {
   return header.grid.Normal() * length;
 }
 
+/// The lower one of two middle values: a gap makes distances longer, never shorter.
 double Median(std::vector<double> values) {
-  const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
+  const auto middle = values.begin() + static_cast<std::ptrdiff_t>((values.size() - 1) / 2);
   std::nth_element(values.begin(), middle, values.end());
   return *middle;
 }
