@@ -48,8 +48,9 @@ Commands DeclareCommands(CLI::App& app) {
 
 std::string CommandNames(const Commands& commands) {
   std::string names;
-  for (const auto& command : commands)
+  for (const auto& command : commands) {
     names += (names.empty() ? "" : ", ") + command->GetName();
+  }
   return names;
 }
 
@@ -59,15 +60,17 @@ std::string NoCommandText(const Commands& commands) {
 
 /// To the parser an unknown command is just one more unexpected argument.
 void CheckCommandName(const std::vector<std::string>& arguments, const Commands& commands) {
-  if (arguments.empty())
+  if (arguments.empty()) {
     throw UsageError(NoCommandText(commands));
+  }
   const std::string& name = arguments.front();
   const bool isKnown = std::any_of(commands.begin(), commands.end(), [&name](const auto& command) {
     return command->GetName() == name;
   });
-  if (!isKnown && name.substr(0, 1) != "-")
+  if (!isKnown && name.substr(0, 1) != "-") {
     throw UsageError("there is no command " + study::Quoted(name) + "; there are " +
                      CommandNames(commands));
+  }
 }
 
 Command* FindChosen(const Commands& commands) {
@@ -77,7 +80,7 @@ Command* FindChosen(const Commands& commands) {
 }
 
 void TellError(const std::string& text) {
-  std::fprintf(stderr, "vorl: %s\n", text.c_str());
+  static_cast<void>(std::fprintf(stderr, "vorl: %s\n", text.c_str()));
 }
 
 int TellUsageError(const std::string& text, const Command* command) {
@@ -91,8 +94,9 @@ int TellUsageError(const std::string& text, const Command* command) {
 std::string TextOf(const CLI::ParseError& error) {
   std::string text = error.what();
   std::replace(text.begin(), text.end(), '\n', ' ');
-  if (!text.empty())
+  if (!text.empty()) {
     text[0] = static_cast<char>(std::tolower(static_cast<unsigned char>(text[0])));
+  }
   return text;
 }
 
@@ -118,11 +122,13 @@ int Run(const std::vector<std::string>& arguments) {
   try {
     CheckCommandName(arguments, commands);
     Console plain(true);
-    if (!Parse(app, arguments, plain))
+    if (!Parse(app, arguments, plain)) {
       return kExitSuccess;
+    }
     Command* const command = FindChosen(commands);
-    if (command == nullptr)
+    if (command == nullptr) {
       throw UsageError(NoCommandText(commands));
+    }
     command->Check();
     Console console(command->IsQuiet());
     command->Run(console);

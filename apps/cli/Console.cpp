@@ -3,7 +3,7 @@
 
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
+#include <system_error>
 
 namespace cli {
 
@@ -15,19 +15,22 @@ study::Progress Console::GetProgress() {
 }
 
 void Console::Note(const std::string& text) {
-  if (m_quiet)
+  if (m_quiet) {
     return;
+  }
   m_bar.Clear();
-  std::fprintf(stderr, "vorl: note: %s\n", text.c_str());
+  static_cast<void>(std::fprintf(stderr, "vorl: note: %s\n", text.c_str()));
 }
 
 void Console::Print(const std::string& text) {
   m_bar.Clear();
   errno = 0;
   const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
-  if (std::fflush(stdout) != 0 || !written)
-    throw study::Error(std::string("can't write to the standard output: ") +
-                       (errno != 0 ? std::strerror(errno) : "the writing failed"));
+  if (std::fflush(stdout) != 0 || !written) {
+    throw study::Error(
+        std::string("can't write to the standard output: ") +
+        (errno != 0 ? std::generic_category().message(errno) : "the writing failed"));
+  }
 }
 
 }  // namespace cli

@@ -21,8 +21,9 @@ std::string HelpFormatter::make_help(const CLI::App* app, std::string,
 std::string HelpFormatter::UsageLines() const {
   std::istringstream forms(m_usage);
   std::string text;
-  for (std::string form; std::getline(forms, form);)
+  for (std::string form; std::getline(forms, form);) {
     text += (text.empty() ? "Usage: " : "       ") + m_program + " " + form + "\n";
+  }
   return text;
 }
 
@@ -36,8 +37,9 @@ std::string HelpFormatter::OptionGroups(const CLI::App& app) const {
         app.get_options([&group](const CLI::Option* option) {
           return option->get_group() == group && option->nonpositional();
         });
-    if (!options.empty())
+    if (!options.empty()) {
       text += make_group(group, false, options);
+    }
   }
   return text;
 }

@@ -22,9 +22,10 @@ StoredRange RangeOf(study::Study& study, const study::Progress& progress) {
   double done = 0;
   for (dSlice& slice : study.volume.GetSliceList()) {
     study::Report(progress, done++ / count, "searching the range");
-    if (!op.Run(&slice.GetImage(), range.minimum, range.maximum))
+    if (!op.Run(&slice.GetImage(), range.minimum, range.maximum)) {
       throw study::Error("can't search the range: " +
                          std::string(static_cast<const char*>(op.GetStatus())));
+    }
   }
   return range;
 }
@@ -62,9 +63,10 @@ std::string SliceKind(const study::Study& study) {
 
 std::string SeriesLines(const study::LoadReport& report) {
   std::string text;
-  for (std::size_t i = 0; i < report.series.size(); ++i)
+  for (std::size_t i = 0; i < report.series.size(); ++i) {
     text += Line(i == report.chosen ? "Series:" : "Also there:",
                  "#" + std::to_string(i + 1) + " " + study::SeriesText(report.series[i]));
+  }
   return text;
 }
 
@@ -105,9 +107,10 @@ std::string ValueLines(const study::Study& study, const StoredRange& range) {
                                         NumberText(study.RealValue(range.maximum)),
                                     study)) +
       Line("Unit:", study.unit.empty() ? "none" : study.unit);
-  if (study.windowWidth > 0)
+  if (study.windowWidth > 0) {
     text += Line("Window:", "centre " + NumberText(study.windowCentre) + ", width " +
                                 NumberText(study.windowWidth));
+  }
   return text;
 }
 
@@ -131,10 +134,12 @@ class InfoCommand : public Command {
     study::Study& study = *input.study;
     const StoredRange range = RangeOf(study, study::PartOf(progress, 0.9, 1));
     std::string text = Line("Input:", input.name) + SeriesLines(input.report);
-    if (!study.modality.empty())
+    if (!study.modality.empty()) {
       text += Line("Modality:", study.modality);
-    if (!study.description.empty())
+    }
+    if (!study.description.empty()) {
       text += Line("Description:", study.description);
+    }
     console.Print(text + GeometryLines(study) + ValueLines(study, range));
   }
 

@@ -13,35 +13,41 @@ constexpr char kInputGroup[] = "Input";
 constexpr std::size_t kMostRefusals = 5;
 
 std::string Joined(const std::vector<std::string>& paths) {
-  if (paths.size() > 1)
+  if (paths.size() > 1) {
     return paths.front() + " and " + std::to_string(paths.size() - 1) + " more";
+  }
   return paths.front();
 }
 
 void TellOtherSeries(Console& console, const study::LoadReport& report) {
-  if (report.series.size() < 2)
+  if (report.series.size() < 2) {
     return;
+  }
   const std::string how = report.chosen == 0 ? "the largest is taken" : "the chosen one is taken";
   console.Note("there are " + std::to_string(report.series.size()) + " series, " + how +
                "; choose with --series:");
-  for (std::size_t i = 0; i < report.series.size(); ++i)
+  for (std::size_t i = 0; i < report.series.size(); ++i) {
     console.Note("  #" + std::to_string(i + 1) + (i == report.chosen ? " (taken) " : " ") +
                  study::SeriesText(report.series[i]));
+  }
 }
 
 void TellRefused(Console& console, const study::LoadReport& report) {
   const std::size_t told = std::min(report.refused.size(), kMostRefusals);
-  for (std::size_t i = 0; i < told; ++i)
+  for (std::size_t i = 0; i < told; ++i) {
     console.Note("left out " + study::RefusalText(report.refused[i]));
-  if (report.refused.size() > told)
+  }
+  if (report.refused.size() > told) {
     console.Note("left out " + std::to_string(report.refused.size() - told) + " more");
+  }
 }
 
 void Tell(Console& console, const study::LoadReport& report) {
   TellOtherSeries(console, report);
   TellRefused(console, report);
-  for (const std::string& note : report.notes)
+  for (const std::string& note : report.notes) {
     console.Note(note);
+  }
 }
 
 }  // namespace
@@ -66,10 +72,11 @@ void InputOptions::AddTo(CLI::App& command) {
 }
 
 std::string InputOptions::TakeLastPath(const std::string& what) {
-  if (m_paths.empty() || (m_paths.size() == 1 && !WantsPhantom()))
+  if (m_paths.empty() || (m_paths.size() == 1 && !WantsPhantom())) {
     throw UsageError(m_paths.empty()
                          ? "no input and no " + what + " are named"
                          : "after " + study::Quoted(m_paths[0]) + ", the " + what + " is missing");
+  }
   std::string last = m_paths.back();
   m_paths.pop_back();
   return last;
@@ -78,10 +85,12 @@ std::string InputOptions::TakeLastPath(const std::string& what) {
 void InputOptions::Check() const {
   if (WantsPhantom()) {
     ParseSize("--phantom", m_phantom, 3, "WIDTHxHEIGHTxSLICES");
-    if (!m_paths.empty())
+    if (!m_paths.empty()) {
       throw UsageError(study::Quoted(m_paths.front()) + " and --phantom exclude each other");
-    if (!m_series.empty())
+    }
+    if (!m_series.empty()) {
       throw UsageError("--series and --phantom exclude each other");
+    }
   } else if (m_paths.empty()) {
     throw UsageError("no input is named (files, a folder, or --phantom)");
   }
@@ -107,10 +116,11 @@ std::vector<std::string> NormaliseArguments(const std::vector<std::string>& argu
   for (const std::string& argument : arguments) {
     const bool inBrackets =
         argument.size() > 1 && argument.front() == '[' && argument.back() == ']';
-    if (!normal.empty() && normal.back() == "--phantom" && LooksLikeSize(argument, 3))
+    if (!normal.empty() && normal.back() == "--phantom" && LooksLikeSize(argument, 3)) {
       normal.back() += "=" + argument;
-    else
+    } else {
       normal.push_back(inBrackets ? "./" + argument : argument);
+    }
   }
   return normal;
 }

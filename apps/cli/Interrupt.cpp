@@ -18,8 +18,9 @@ extern "C" void OnInterrupt(int) {
 #ifndef _WIN32
 void Catch(int signal) {
   struct sigaction action {};
-  if (sigaction(signal, nullptr, &action) != 0 || action.sa_handler == SIG_IGN)
+  if (sigaction(signal, nullptr, &action) != 0 || action.sa_handler == SIG_IGN) {
     return;
+  }
   action = {};
   action.sa_handler = OnInterrupt;
   action.sa_flags = SA_RESTART;
@@ -32,15 +33,15 @@ void Catch(int signal) {
 
 void CatchInterrupts() {
 #ifdef _WIN32
-  std::signal(SIGINT, OnInterrupt);
-  std::signal(SIGTERM, OnInterrupt);
-  std::signal(SIGBREAK, OnInterrupt);
+  static_cast<void>(std::signal(SIGINT, OnInterrupt));
+  static_cast<void>(std::signal(SIGTERM, OnInterrupt));
+  static_cast<void>(std::signal(SIGBREAK, OnInterrupt));
 #else
   Catch(SIGINT);
   Catch(SIGTERM);
   Catch(SIGHUP);
-  std::signal(SIGPIPE, SIG_IGN);
-  std::signal(SIGXFSZ, SIG_IGN);
+  static_cast<void>(std::signal(SIGPIPE, SIG_IGN));
+  static_cast<void>(std::signal(SIGXFSZ, SIG_IGN));
 #endif
 }
 

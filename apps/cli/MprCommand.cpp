@@ -121,64 +121,77 @@ void MprCommand::AddGreyOptions() {
 }
 
 void MprCommand::CheckOutputs() const {
-  if (m_texts.output.empty() && m_texts.slice.empty())
+  if (m_texts.output.empty() && m_texts.slice.empty()) {
     throw UsageError("no output is named (-o OUT.png, -o OUT.bmp or --save-slice OUT.bdf)");
-  if (!m_texts.output.empty())
+  }
+  if (!m_texts.output.empty()) {
     CheckExtension("-o", m_texts.output, {".png", ".bmp"});
-  if (!m_texts.slice.empty())
+  }
+  if (!m_texts.slice.empty()) {
     CheckExtension("--save-slice", m_texts.slice, {".bdf"});
+  }
 }
 
 void MprCommand::CheckPlane() {
   study::PlaneRequest& plane = m_request.plane;
   study::Vec3 turn;
-  if (m_texts.plane == "coronal")
+  if (m_texts.plane == "coronal") {
     plane.plane = study::Plane::Coronal;
-  else if (m_texts.plane == "sagittal")
+  } else if (m_texts.plane == "sagittal") {
     plane.plane = study::Plane::Sagittal;
-  else if (m_texts.plane == "oblique")
+  } else if (m_texts.plane == "oblique") {
     turn = kObliqueTurn;
-  else if (m_texts.plane != "axial")
+  } else if (m_texts.plane != "axial") {
     throw UsageError("--plane: " + study::Quoted(m_texts.plane) +
                      " is not one of axial, coronal, sagittal, oblique");
-  if (!m_texts.rotation.empty())
+  }
+  if (!m_texts.rotation.empty()) {
     turn = ParseTriple("--rotate", m_texts.rotation);
+  }
   plane.turnAboutRight = turn.x;
   plane.turnAboutDown = turn.y;
   plane.turnAboutNormal = turn.z;
-  if (!m_texts.centre.empty())
+  if (!m_texts.centre.empty()) {
     plane.centre = ParseTriple("--center", m_texts.centre);
+  }
   if (!m_texts.size.empty()) {
     const std::vector<int> size = ParseSize("--size", m_texts.size, 2, "WIDTHxHEIGHT");
     plane.width = size[0];
     plane.height = size[1];
   }
-  if (!m_texts.spacing.empty())
+  if (!m_texts.spacing.empty()) {
     plane.spacing = ParsePositive("--spacing", m_texts.spacing);
+  }
 }
 
 void MprCommand::CheckSampling() {
-  if (!m_texts.thickness.empty())
+  if (!m_texts.thickness.empty()) {
     m_request.plane.thickness = ParsePositive("--thickness", m_texts.thickness);
+  }
   if (!m_texts.steps.empty()) {
     m_request.steps = ParseWhole("--steps", m_texts.steps, 2, kMostSteps);
-    if (m_texts.thickness.empty())
+    if (m_texts.thickness.empty()) {
       throw UsageError("--steps needs --thickness");
+    }
   }
-  if (m_texts.filter != "nearest" && m_texts.filter != "linear")
+  if (m_texts.filter != "nearest" && m_texts.filter != "linear") {
     throw UsageError("--filter: " + study::Quoted(m_texts.filter) +
                      " is not one of nearest, linear");
+  }
   m_request.linear = m_texts.filter == "linear";
 }
 
 void MprCommand::CheckGrey() {
   m_window = ParseWindow("--window", m_texts.window);
-  if (!m_texts.brightness.empty())
+  if (!m_texts.brightness.empty()) {
     m_display.brightness = ParseNumberIn("--brightness", m_texts.brightness, -1, 1);
-  if (!m_texts.contrast.empty())
+  }
+  if (!m_texts.contrast.empty()) {
     m_display.contrast = ParseNumberIn("--contrast", m_texts.contrast, -1, 1);
-  if (!m_texts.gamma.empty())
+  }
+  if (!m_texts.gamma.empty()) {
     m_display.gamma = ParseNumberIn("--gamma", m_texts.gamma, 0.01, 10);
+  }
 }
 
 void MprCommand::Check() {
@@ -192,37 +205,44 @@ void MprCommand::Check() {
 void MprCommand::Cut(Console& console, const Input& input, const study::Progress& progress) {
   study::Study& study = *input.study;
   m_display.window = ResolveWindow(m_window, study);
-  if (m_window.kind == WindowChoice::Kind::Preset && study.unit != "HU")
+  if (m_window.kind == WindowChoice::Kind::Preset && study.unit != "HU") {
     console.Note("the window " + study::Quoted(m_texts.window) +
                  " is meant for Hounsfield units, the values are in " +
                  (study.unit.empty() ? "no unit" : study.unit));
+  }
   const auto cut = CutPlane(study, m_request, study::PartOf(progress, 0, 0.7));
-  if (!MeetsVolume(study, *cut))
+  if (!MeetsVolume(study, *cut)) {
     console.Note("the plane does not meet the volume");
+  }
   Save(*cut, study::PartOf(progress, 0.7, 1));
 }
 
 void MprCommand::Save(study::Study& cut, const study::Progress& progress) const {
   cut.windowCentre = m_display.window.centre;
   cut.windowWidth = m_display.window.width;
-  if (!m_texts.slice.empty())
+  if (!m_texts.slice.empty()) {
     study::WriteStudyFile(cut, m_texts.slice, study::PartOf(progress, 0, 0.5));
-  if (m_texts.output.empty())
+  }
+  if (m_texts.output.empty()) {
     return;
+  }
   study::Report(progress, 0.5, "making the picture");
   dImage picture;
   MakePicture(cut, m_display, picture);
   study::Report(progress, 0.7, "writing the picture");
-  if (ExtensionOf(m_texts.output) == ".bmp")
+  if (ExtensionOf(m_texts.output) == ".bmp") {
     study::SaveBmp(picture, m_texts.output);
-  else
+  } else {
     study::SavePng(picture, m_texts.output);
+  }
 }
 
 void MprCommand::Run(Console& console) {
-  for (const std::string& path : {m_texts.output, m_texts.slice})
-    if (!path.empty())
+  for (const std::string& path : {m_texts.output, m_texts.slice}) {
+    if (!path.empty()) {
       CheckPlace(path);
+    }
+  }
   const study::Progress progress = console.GetProgress();
   const Input input = m_input.Load(console, study::PartOf(progress, 0, 0.7));
   Cut(console, input, study::PartOf(progress, 0.7, 1));

@@ -28,11 +28,13 @@ void CheckExtension(const std::string& option, const std::string& path,
                     const std::vector<std::string>& extensions) {
   const std::string extension = ExtensionOf(path);
   if (IsDevice(path) ||
-      std::find(extensions.begin(), extensions.end(), extension) != extensions.end())
+      std::find(extensions.begin(), extensions.end(), extension) != extensions.end()) {
     return;
+  }
   std::string wanted;
-  for (const std::string& one : extensions)
+  for (const std::string& one : extensions) {
     wanted += (wanted.empty() ? "" : " or ") + one;
+  }
   throw UsageError(option + ": the name " + study::Quoted(path) + " does not end in " + wanted);
 }
 

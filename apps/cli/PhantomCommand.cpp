@@ -27,8 +27,9 @@ constexpr std::array<std::pair<const char*, DicomEncoding>, 7> kEncodings{
 DicomEncoding ParseEncoding(const std::string& text) {
   std::string names;
   for (const auto& [name, encoding] : kEncodings) {
-    if (text == name)
+    if (text == name) {
       return encoding;
+    }
     names += std::string(names.empty() ? "" : ", ") + name;
   }
   throw UsageError("--encoding: " + study::Quoted(text) + " is not one of " + names);
@@ -56,30 +57,36 @@ class PhantomCommand : public Command {
   }
 
   void Check() override {
-    if (m_output.empty())
+    if (m_output.empty()) {
       throw UsageError("no output is named (a file OUT.bdf, or a folder)");
+    }
     m_isFile = ExtensionOf(m_output) == ".bdf" || IsDevice(m_output);
-    if (!m_isFile && !std::filesystem::is_directory(m_output) && !ExtensionOf(m_output).empty())
+    if (!m_isFile && !std::filesystem::is_directory(m_output) && !ExtensionOf(m_output).empty()) {
       throw UsageError("the output: the name " + study::Quoted(m_output) +
                        " does not end in .bdf, and is not that of a folder either");
+    }
     m_size = ParseSize("--size", m_sizeText, 3, "WIDTHxHEIGHTxSLICES");
-    if (m_isFile && !m_encodingText.empty())
+    if (m_isFile && !m_encodingText.empty()) {
       throw UsageError("--encoding is for DICOM series only");
-    if (!m_encodingText.empty())
+    }
+    if (!m_encodingText.empty()) {
       m_options.encoding = ParseEncoding(m_encodingText);
+    }
   }
 
   void Run(Console& console) override {
-    if (m_isFile)
+    if (m_isFile) {
       CheckPlace(m_output);
+    }
     const study::Progress progress = console.GetProgress();
     const auto phantom =
         study::MakePhantom(m_size[0], m_size[1], m_size[2], study::PartOf(progress, 0, 0.5));
     const study::Progress rest = study::PartOf(progress, 0.5, 1);
-    if (m_isFile)
+    if (m_isFile) {
       study::WriteStudyFile(*phantom, m_output, rest);
-    else
+    } else {
       study::WriteDicomSeries(*phantom, m_output, m_options, rest);
+    }
   }
 
  private:

@@ -33,8 +33,9 @@ bool IsTerminal() {
 int TerminalColumns() {
 #ifndef _WIN32
   winsize size{};
-  if (ioctl(STDERR_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0)
+  if (ioctl(STDERR_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0) {
     return size.ws_col;
+  }
 #endif
   return kUsualColumns;
 }
@@ -64,11 +65,13 @@ ProgressBar::ProgressBar(bool wanted) : m_enabled(wanted && IsTerminal()) {}
 
 void ProgressBar::Show(double fraction, const std::string& what) {
   const Clock::time_point now = Clock::now();
-  if (!m_enabled || (!m_shown.empty() && now - m_shownAt < kPause))
+  if (!m_enabled || (!m_shown.empty() && now - m_shownAt < kPause)) {
     return;
+  }
   const std::string text = ProgressText(fraction, what, TerminalColumns());
-  if (text == m_shown)
+  if (text == m_shown) {
     return;
+  }
   const std::size_t leftOver = m_shown.size() > text.size() ? m_shown.size() - text.size() : 0;
   Write(std::string(1, '\r').append(text).append(leftOver, ' '));
   m_shown = text;
@@ -76,8 +79,9 @@ void ProgressBar::Show(double fraction, const std::string& what) {
 }
 
 void ProgressBar::Clear() {
-  if (m_shown.empty())
+  if (m_shown.empty()) {
     return;
+  }
   Write(std::string(1, '\r').append(m_shown.size(), ' ').append(1, '\r'));
   m_shown.clear();
 }

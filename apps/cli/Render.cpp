@@ -22,13 +22,15 @@ constexpr std::chrono::milliseconds kPoll(2);
 
 void CheckStatus(const OpBase& op, const std::string& what) {
   const dStatus& status = op.GetStatus();
-  if (static_cast<long>(status) != 0)
+  if (static_cast<long>(status) != 0) {
     throw study::Error("can't " + what + ": " + static_cast<const char*>(status));
+  }
 }
 
 void WaitForEnd(const OpBase& op) {
-  while (op.IsRunning())
+  while (op.IsRunning()) {
     std::this_thread::sleep_for(kPoll);
+  }
 }
 
 /// Runs an operator in its own thread, so that its progress can be shown and it can be stopped.
@@ -61,9 +63,10 @@ void CheckReach(const study::Study& study, const study::PlaneGeometry& plane, do
                               depth * ((corner & 4) != 0 ? 1.0 : -1.0);
     const study::Vec3 voxel = study::VoxelFromWorld(study, point);
     if (std::max({std::abs(voxel.x), std::abs(voxel.y), std::abs(voxel.z)}) >
-        study::kLargestVolumeSide)
+        study::kLargestVolumeSide) {
       throw study::Error("the plane reaches more than " +
                          std::to_string(study::kLargestVolumeSide) + " voxels away");
+    }
   }
 }
 
@@ -96,8 +99,9 @@ std::unique_ptr<study::Study> CutPlane(study::Study& study, const CutRequest& re
   op.volume = &study.volume;
   op.mprSlice = &slice;
   op.SelectAlgo(request.linear ? MPRAlgo_Trilinear : MPRAlgo_Nearest);
-  if (request.plane.thickness > 0)
+  if (request.plane.thickness > 0) {
     op.SetDepthSteps(request.steps > 0 ? request.steps : -1);
+  }
   RunWatched(op, progress, "cutting the plane");
   CheckStatus(op, "cut the plane");
 
@@ -112,8 +116,9 @@ bool MeetsVolume(const study::Study& study, const study::Study& cut) {
   const dCoordSys3D& place = cut.volume.GetCoordinates();
   for (const dVect3D& axis : {place.axisX, place.axisY, place.axisZ}) {
     const study::Vec3 direction = study::Normalised(study::ToVec3(axis));
-    if (!Overlap(study::ExtentAlong(study, direction), study::ExtentAlong(cut, direction)))
+    if (!Overlap(study::ExtentAlong(study, direction), study::ExtentAlong(cut, direction))) {
       return false;
+    }
   }
   return true;
 }
@@ -132,8 +137,9 @@ void MakePicture(study::Study& cut, const Display& display, dImage& picture) {
   dWindowingLUT table;
   table.SetWindow(window.centre, window.width);
   // The neutral second stage is not quite the identity; without one the levels are exact.
-  if (display.brightness != 0 || display.contrast != 0 || display.gamma != 1)
+  if (display.brightness != 0 || display.contrast != 0 || display.gamma != 1) {
     table.SetBCGLUT(&levels);
+  }
   const opLookup lookup(samples, &picture, &table);
   CheckStatus(lookup, "make the picture");
 }

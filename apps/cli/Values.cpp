@@ -22,11 +22,13 @@ std::optional<T> Whole(const std::string& text) {
   T value{};
   const char* begin = text.data();
   const char* end = begin + text.size();
-  if (text.size() > 1 && text[0] == '+' && text[1] != '-')
+  if (text.size() > 1 && text[0] == '+' && text[1] != '-') {
     ++begin;
+  }
   const auto result = std::from_chars(begin, end, value);
-  if (result.ec != std::errc() || result.ptr != end)
+  if (result.ec != std::errc() || result.ptr != end) {
     return std::nullopt;
+  }
   return value;
 }
 
@@ -41,8 +43,9 @@ std::vector<std::string> Split(const std::string& text, const char* separators) 
   for (;;) {
     const std::size_t end = text.find_first_of(separators, begin);
     parts.push_back(text.substr(begin, end - begin));
-    if (end == std::string::npos)
+    if (end == std::string::npos) {
       return parts;
+    }
     begin = end + 1;
   }
 }
@@ -51,8 +54,9 @@ std::optional<std::vector<int>> SplitSize(const std::string& text, std::size_t c
   std::vector<int> sizes;
   for (const std::string& part : Split(text, "xX")) {
     const std::optional<int> size = Whole<int>(part);
-    if (!size || *size < 1 || *size > study::kLargestVolumeSide)
+    if (!size || *size < 1 || *size > study::kLargestVolumeSide) {
       return std::nullopt;
+    }
     sizes.push_back(*size);
   }
   return sizes.size() == count ? std::optional(sizes) : std::nullopt;
@@ -62,47 +66,53 @@ std::optional<std::vector<int>> SplitSize(const std::string& text, std::size_t c
 
 double ParseNumber(const std::string& option, const std::string& text) {
   const std::optional<double> value = Finite(text);
-  if (!value)
+  if (!value) {
     Refuse(option, text, "a number");
+  }
   return *value;
 }
 
 double ParseNumberIn(const std::string& option, const std::string& text, double minimum,
                      double maximum) {
   const std::optional<double> value = Finite(text);
-  if (!value || *value < minimum || *value > maximum)
+  if (!value || *value < minimum || *value > maximum) {
     Refuse(option, text, "a number from " + NumberText(minimum) + " to " + NumberText(maximum));
+  }
   return *value;
 }
 
 double ParsePositive(const std::string& option, const std::string& text) {
   const std::optional<double> value = Finite(text);
-  if (!value || *value <= 0)
+  if (!value || *value <= 0) {
     Refuse(option, text, "a number greater than 0");
+  }
   return *value;
 }
 
 int ParseWhole(const std::string& option, const std::string& text, int minimum, int maximum) {
   const std::optional<int> value = Whole<int>(text);
-  if (!value || *value < minimum || *value > maximum)
+  if (!value || *value < minimum || *value > maximum) {
     Refuse(option, text,
            "a whole number from " + std::to_string(minimum) + " to " + std::to_string(maximum));
+  }
   return *value;
 }
 
 study::Vec3 ParseTriple(const std::string& option, const std::string& text) {
   const std::vector<double> numbers = SplitNumbers(text);
-  if (numbers.size() != 3)
+  if (numbers.size() != 3) {
     Refuse(option, text, "X,Y,Z (three numbers with commas between them)");
+  }
   return {numbers[0], numbers[1], numbers[2]};
 }
 
 std::vector<int> ParseSize(const std::string& option, const std::string& text, std::size_t count,
                            const std::string& form) {
   const std::optional<std::vector<int>> sizes = SplitSize(text, count);
-  if (!sizes)
+  if (!sizes) {
     Refuse(option, text,
            form + " (whole numbers from 1 to " + std::to_string(study::kLargestVolumeSide) + ")");
+  }
   return *sizes;
 }
 
@@ -118,8 +128,9 @@ std::vector<double> SplitNumbers(const std::string& text) {
   std::vector<double> numbers;
   for (const std::string& part : Split(text, ",")) {
     const std::optional<double> number = Finite(part);
-    if (!number)
+    if (!number) {
       return {};
+    }
     numbers.push_back(*number);
   }
   return numbers;
@@ -139,8 +150,9 @@ std::string LengthText(double value) {
   const auto single = static_cast<float>(value);
   char text[64];
   std::snprintf(text, sizeof text, "%.9g", static_cast<double>(single));
-  if (std::strtod(text, nullptr) == static_cast<double>(single))
+  if (std::strtod(text, nullptr) == static_cast<double>(single)) {
     return text;
+  }
   const auto result = std::to_chars(text, text + sizeof text, single);
   return {text, result.ptr};
 }

@@ -36,9 +36,11 @@ using Histogram = std::vector<std::uint64_t>;
 
 Histogram HistogramOf(const study::Study& study) {
   Histogram counts(static_cast<std::size_t>(kStoredValues));
-  for (const dSlice& slice : study.volume.GetSliceList())
-    for (const std::uint16_t sample : study::SamplesOf(slice))
+  for (const dSlice& slice : study.volume.GetSliceList()) {
+    for (const std::uint16_t sample : study::SamplesOf(slice)) {
       ++counts[sample];
+    }
+  }
   return counts;
 }
 
@@ -57,18 +59,23 @@ std::ptrdiff_t PassTail(Iterator begin, Iterator end, double tail) {
 }  // namespace
 
 WindowChoice ParseWindow(const std::string& option, const std::string& text) {
-  if (text.empty())
+  if (text.empty()) {
     return {};
-  if (text == "auto")
+  }
+  if (text == "auto") {
     return {WindowChoice::Kind::Auto, {}};
-  for (const Preset& preset : kPresets)
-    if (text == preset.name)
+  }
+  for (const Preset& preset : kPresets) {
+    if (text == preset.name) {
       return {WindowChoice::Kind::Preset, preset.window};
+    }
+  }
   const std::vector<double> numbers = SplitNumbers(text);
   if (numbers.size() != 2 || numbers[1] <= 0) {
     std::string names;
-    for (const Preset& preset : kPresets)
+    for (const Preset& preset : kPresets) {
       names += std::string(", ") + preset.name;
+    }
     throw UsageError(option + ": " + study::Quoted(text) +
                      " is neither CENTER,WIDTH (a width greater than 0) nor one of auto" + names);
   }
@@ -78,12 +85,13 @@ WindowChoice ParseWindow(const std::string& option, const std::string& text) {
 std::string PresetList() {
   constexpr std::size_t kPerLine = 3;
   std::string list;
-  for (std::size_t i = 0; i < kPresets.size(); ++i)
+  for (std::size_t i = 0; i < kPresets.size(); ++i) {
     list += std::string(i == 0              ? ""
                         : i % kPerLine == 0 ? ",\n"
                                             : ", ") +
             kPresets[i].name + " " + NumberText(kPresets[i].window.centre) + "," +
             NumberText(kPresets[i].window.width);
+  }
   return list;
 }
 
@@ -104,8 +112,9 @@ RealWindow ResolveWindow(const WindowChoice& choice, study::Study& study) {
     case WindowChoice::Kind::Numbers:
       return choice.window;
     case WindowChoice::Kind::Input:
-      if (study.windowWidth > 0)
+      if (study.windowWidth > 0) {
         return {study.windowCentre, study.windowWidth};
+      }
       break;
     case WindowChoice::Kind::Auto:
       break;
