@@ -89,4 +89,15 @@ inline long ThrownCode(const std::function<void()>& action) {
   return 0;
 }
 
+/// Reads items of a file of type "T".
+class BinaryDataInTest : public BinaryFileTest {
+ protected:
+  /// The code thrown by `read` on a file of these items.
+  long CodeOf(const Bytes& items, const std::function<void(BinaryDataIn&)>& read) const {
+    MakeItems(items);
+    BinaryDataIn in(FileName(), "T");
+    return ThrownCode([&] { read(in); });
+  }
+};
+
 #endif
