@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <ostream>
 
 #include "MprModel.h"
 #include "Volumes.h"
@@ -93,18 +94,20 @@ class Case {
     m_op.SetDepthSteps(random.Pick(kDepthSteps));
   }
 
-  std::string Text() const {
-    const auto text = [](const dVect3D& v) {
-      return "(" + std::to_string(v.x) + " " + std::to_string(v.y) + " " + std::to_string(v.z) +
-             ")";
+  friend std::ostream& operator<<(std::ostream& out, const Case& shown) {
+    const auto vector = [&](const char* name, const dVect3D& v) {
+      out << ", " << name << " (" << v.x << ' ' << v.y << ' ' << v.z << ')';
     };
-    const dCoordSys3D& plane = m_slice.GetCoordinates();
-    return std::to_string(m_volume.GetSizeX()) + " x " + std::to_string(m_volume.GetSizeY()) +
-           " x " + std::to_string(m_volume.GetSizeZ()) + " to " +
-           std::to_string(m_slice.GetWidth()) + " x " + std::to_string(m_slice.GetHeight()) +
-           ", algorithm " + std::to_string(m_op.algoID) + ", depth steps " +
-           std::to_string(m_op.depthSteps) + ", plane " + text(plane.origin) + text(plane.axisX) +
-           text(plane.axisY) + text(plane.axisZ);
+    const dVolume& volume = shown.m_volume;
+    out << volume.GetSizeX() << " x " << volume.GetSizeY() << " x " << volume.GetSizeZ() << " to "
+        << shown.m_slice.GetWidth() << " x " << shown.m_slice.GetHeight() << ", algorithm "
+        << shown.m_op.algoID << ", depth steps " << shown.m_op.depthSteps;
+    const dCoordSys3D& plane = shown.m_slice.GetCoordinates();
+    vector("at", plane.origin);
+    vector("axisX", plane.axisX);
+    vector("axisY", plane.axisY);
+    vector("axisZ", plane.axisZ);
+    return out;
   }
 
   void Check(Coverage& coverage) {
@@ -168,7 +171,7 @@ void CheckCases(unsigned short type, std::uint32_t seed) {
   Coverage coverage;
   for (int i = 0; i < 1000; ++i) {
     Case<T> testCase(type, random);
-    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase.Text());
+    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase);
     testCase.Check(coverage);
     if (testing::Test::HasFatalFailure()) {
       return;
