@@ -13,11 +13,18 @@ std::int32_t LimitOf(std::int32_t size) {
   return WrapMultiply(size, 65536);
 }
 
+// Slices agree when they are added; the application may have formatted one anew since.
+bool HasFormatOf(const dImage& image, const dImage& model) {
+  return image.IsValid() && image.GetWidth() == model.GetWidth() &&
+         image.GetHeight() == model.GetHeight() && image.GetFormatID() == model.GetFormatID();
+}
+
 }  // namespace
 
 VolumeView::VolumeView(const dVolume& volume)
     : m_width(volume.GetSizeX()),
       m_height(volume.GetSizeY()),
+      m_depth(volume.GetSizeZ()),
       m_pitch(0),
       m_limitX(LimitOf(volume.GetSizeX())),
       m_limitY(LimitOf(volume.GetSizeY())),
@@ -34,12 +41,20 @@ VolumeView::VolumeView(const dVolume& volume)
   m_slices.push_back(first.GetDataPtr());
   for (const dSlice& slice : slices) {
     const dImage& image = slice.GetImage();
-    if (!m_invalidSlice && (!image.IsValid() || image.GetImageSize() < neededBytes)) {
+    if (!m_invalidSlice && (!HasFormatOf(image, first) || image.GetImageSize() < neededBytes)) {
       m_invalidSlice = static_cast<int>(m_slices.size()) - 1;
     }
     m_slices.push_back(image.GetDataPtr());
   }
   m_slices.push_back(m_slices.back());
+}
+
+bool CheckPixels(const dVolume& volume, dStatus& status) {
+  const auto invalid = VolumeView(volume).FindInvalidSlice();
+  if (invalid) {
+    status.Set(false, "invalid pixel data in slice %d of the Volume", *invalid);
+  }
+  return !invalid;
 }
 
 }  // namespace vorl_detail

@@ -32,6 +32,11 @@ class VolumeView {
            point.z >= 0 && point.z < m_limitZ;
   }
 
+  /// True for the indices of a voxel of the volume.
+  bool HoldsVoxel(std::int32_t x, std::int32_t y, std::int32_t z) const {
+    return x >= 0 && x < m_width && y >= 0 && y < m_height && z >= 0 && z < m_depth;
+  }
+
   /// The pixels of slice z, -1 <= z <= number of slices.
   template <class T>
   const T* Slice(std::int32_t z) const {
@@ -40,6 +45,9 @@ class VolumeView {
 
   std::int32_t Width() const { return m_width; }
   std::int32_t Height() const { return m_height; }
+  std::int32_t Depth() const { return m_depth; }
+  /// The sizes in 16.16.
+  FixedVector Limits() const { return {m_limitX, m_limitY, m_limitZ}; }
   /// Samples from one row to the next.
   std::int32_t Pitch() const { return m_pitch; }
 
@@ -48,11 +56,16 @@ class VolumeView {
   std::optional<int> m_invalidSlice;
   std::int32_t m_width;
   std::int32_t m_height;
+  std::int32_t m_depth;
   std::int32_t m_pitch;
   std::int32_t m_limitX;
   std::int32_t m_limitY;
   std::int32_t m_limitZ;
 };
+
+/// False, with the status "invalid pixel data in slice %d of the Volume", when there is such a
+/// slice in the volume, which must not be empty.
+bool CheckPixels(const dVolume& volume, dStatus& status);
 
 }  // namespace vorl_detail
 }  // namespace vorl
