@@ -44,7 +44,11 @@ std::shared_ptr<std::FILE> OpenFile(const char* fileName) {
     return nullptr;  // some systems open it and only refuse to read
   }
   std::FILE* file = std::fopen(fileName, "rb");
-  return file != nullptr ? std::shared_ptr<std::FILE>(file, &std::fclose) : nullptr;
+  if (file == nullptr) {
+    return nullptr;
+  }
+  std::setvbuf(file, nullptr, _IONBF, 0);  // the stream has a buffer of its own
+  return std::shared_ptr<std::FILE>(file, &std::fclose);
 }
 
 // Reads up to `count` bytes from a position; the number of bytes read.
