@@ -1,6 +1,7 @@
 #include <vorl/Operators/IP/opLookup.h>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Pixels.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
 
@@ -53,8 +54,10 @@ bool opLookup::Prepare() {
   m_lookupMode = kNone;
   if (m_pSource == nullptr) {
     m_status.Set(false, "missing source image");
-  } else if (!static_cast<const dImage*>(m_pSource)->IsValid()) {
+  } else if (!m_pSource->IsValid()) {
     m_status.Set(false, "uninitialized source image");
+  } else if (!vorl_detail::HoldsRows(*m_pSource)) {
+    m_status.Set(false, "invalid pixel data in the source image");
   } else if (m_pSource->GetNumChannels() != 1) {
     m_status.Set(false, "multi channel(%d) source images are not supported",
                  m_pSource->GetNumChannels());

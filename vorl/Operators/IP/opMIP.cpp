@@ -8,6 +8,7 @@
 #include <algorithm>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mip.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
 #include <vorl/Operators/IP/kernels/VolumeProjection.h>
@@ -67,7 +68,7 @@ bool opMIP::Prepare() {
     m_status.Set(false, "'Voxel List' is empty");
   } else {
     m_status = true;
-    return !m_stopRequested;
+    return m_stopRequested ? Stopped() : true;
   }
   return false;
 }
@@ -83,6 +84,10 @@ bool opMIP::Process() {
     return false;
   }
   if (!vorl_detail::CheckPixels(*volume, m_status)) {
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(mipSlice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the MIP Slice");
     return false;
   }
   const bool isSigned = dataType == ImageDataType_S16;

@@ -37,7 +37,8 @@ enum MIPAlgo : std::int32_t {
 /// 'MIP Slice'", "incompatible data types(Volume: 0x%x, Slice: 0x%x", "missing input parameter
 /// 'Voxel List'", "'Voxel List' is empty", "invalid MIP Algo ID: %d", "unsupported data type: %d",
 /// "invalid pixel data in slice %d of the Volume" (a slice whose pixels were taken away or laid out
-/// otherwise after it was added).
+/// otherwise after it was added), "invalid pixel data in the MIP Slice" (its buffer was exchanged
+/// for one that does not hold its rows).
 class VORL_API opMIP : public OpBase {
  public:
   opMIP();

@@ -7,6 +7,7 @@
 #include <vorl/Operators/IP/opMPR.h>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
 
@@ -60,7 +61,7 @@ bool opMPR::Prepare() {
                  mprSlice->GetDataType());
   } else {
     m_status = true;
-    return !m_stopRequested;
+    return m_stopRequested ? Stopped() : true;
   }
   return false;
 }
@@ -76,6 +77,10 @@ bool opMPR::Process() {
     return false;
   }
   if (!vorl_detail::CheckPixels(*volume, m_status)) {
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(mprSlice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the MPR Slice");
     return false;
   }
   using Worker = bool (opMPR::*)(dVolume&, dSlice&);

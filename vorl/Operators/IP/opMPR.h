@@ -27,14 +27,18 @@ enum MPRAlgo : std::int32_t { MPRAlgo_Trilinear = 101, MPRAlgo_Nearest = 102 };
 /// (at the last one the voxel itself) by the fractions. A point outside the volume gives 0.
 ///
 /// *Range.* Trilinear results below 0 are stored as 0. Volumes have fewer than 32,768 voxels in
-/// each direction.
+/// each direction, and so far may the plane reach: positions wrap at 32 bits. Pixels whose place
+/// is not a number lie outside.
 ///
-/// *Stopping.* A stop request ends the run within one output row, with the status "stopped".
+/// *Stopping.* A stop request ends the run within one output row, with the status "stopped"; the
+/// rows before it are written.
 ///
 /// *Errors.* "missing input parameter 'Volume'", "given Volume is empty", "missing input parameter
 /// 'MPR Slice'", "incompatible data types(Volume: 0x%x, Slice: 0x%x", "invalid MPR Algo ID: %d",
 /// "unsupported data type: %d", "invalid pixel data in slice %d of the Volume" (a slice whose
-/// pixels were taken away or laid out otherwise after it was added).
+/// pixels were taken away or laid out otherwise after it was added, or whose rows are shorter than
+/// those of slice 0), "invalid pixel data in the MPR Slice" (its buffer was exchanged for one that
+/// does not hold its rows).
 class VORL_API opMPR : public OpBase {
  public:
   opMPR();

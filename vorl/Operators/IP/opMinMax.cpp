@@ -4,6 +4,7 @@
 #include <limits>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Pixels.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
 
@@ -77,8 +78,12 @@ bool opMinMax::Prepare() {
     m_status.Set(false, "missing source image");
     return false;
   }
-  if (!static_cast<const dImage*>(m_pSource)->IsValid()) {
+  if (!m_pSource->IsValid()) {
     m_status.Set(false, "uninitialized source image");
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(*m_pSource)) {
+    m_status.Set(false, "invalid pixel data in the source image");
     return false;
   }
   m_status = true;

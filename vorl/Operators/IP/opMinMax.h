@@ -17,8 +17,9 @@ inline namespace vorl {
 /// the values that stand in the operator, so that results extend over several images; 2147483647
 /// and -2147483648 start afresh.
 ///
-/// *Errors.* "missing source image", "uninitialized source image", "unsupported data type: %d(%d
-/// bit)".
+/// *Errors.* "missing source image", "uninitialized source image", "invalid pixel data in the
+/// source image" (its buffer was exchanged for one that does not hold its rows), "unsupported data
+/// type: %d(%d bit)", and "stopped" after a stop request.
 class VORL_API opMinMax : public OpBase {
  public:
   opMinMax();

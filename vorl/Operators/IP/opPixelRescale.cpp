@@ -2,6 +2,7 @@
 
 #include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Pixels.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
 
@@ -68,21 +69,29 @@ bool opPixelRescale::Process() {
     m_pTarget = m_pSource;
     return true;
   }
+  bool ok = false;
   switch (m_pSource->GetDataType()) {
     case ImageDataType_U8:
-      return RescaleU8(m_pSource, m_pTarget, m_factor, m_offset);
+      ok = RescaleU8(m_pSource, m_pTarget, m_factor, m_offset);
+      break;
     case ImageDataType_S8:
-      return RescaleS8(m_pSource, m_pTarget, m_factor, m_offset);
+      ok = RescaleS8(m_pSource, m_pTarget, m_factor, m_offset);
+      break;
     case ImageDataType_U16:
-      return RescaleU16(m_pSource, m_pTarget, m_factor, m_offset);
+      ok = RescaleU16(m_pSource, m_pTarget, m_factor, m_offset);
+      break;
     case ImageDataType_S16:
-      return RescaleS16(m_pSource, m_pTarget, m_factor, m_offset);
+      ok = RescaleS16(m_pSource, m_pTarget, m_factor, m_offset);
+      break;
     default:
       m_status.Set(false, "unsupported pixel data type: %s",
                    dImage::DataType2Str(m_pSource->GetDataType()));
-      context.Status(__LINE__, m_status);
-      return false;
+      break;
   }
+  if (!ok) {
+    context.Status(__LINE__, m_status);
+  }
+  return ok;
 }
 
 template <class T>
@@ -97,6 +106,14 @@ bool opPixelRescale::Rescale(dImage* source, dImage* target, double factor, doub
   }
   // One dense run of samples, taken in pieces of a row's length so that it can be stopped.
   const std::size_t length = source->GetDataSamplesInRow();
+  const std::uint64_t runBytes = std::uint64_t{length} * source->GetNumRows() * sizeof(T);
+  for (const dImage* image : {source, target}) {
+    if (!vorl_detail::HoldsBytes(*image, runBytes, sizeof(T))) {
+      m_status.Set(false, "invalid pixel data in the %s image",
+                   image == source ? "source" : "target");
+      return false;
+    }
+  }
   const auto row = [&](std::size_t index) {
     vorl_detail::RescaleRunRef(from + index * length, to + index * length, length, factor, offset);
   };

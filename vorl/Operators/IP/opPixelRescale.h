@@ -10,7 +10,7 @@
 inline namespace vorl {
 
 /// Computes sample * factor + offset, truncated towards zero and saturated to the source's own data
-/// type: unsigned or signed, 8 or 16 bits.
+/// type: unsigned or signed, 8 or 16 bits. A result that is not a number counts as 0.
 ///
 /// *Shape.* The target is formatted like the source; without one the source is rescaled in place.
 /// The samples are taken as one dense run of (rows x samples in a row) from the start of the
@@ -20,7 +20,9 @@ inline namespace vorl {
 /// a separate target image keeps its pixels unwritten.
 ///
 /// *Errors.* "uninitialized parameter: m_pSource = null", "error while initializing target image: "
-/// followed by the target's message, "unsupported pixel data type: %s".
+/// followed by the target's message, "unsupported pixel data type: %s", "invalid pixel data in the
+/// source image" or "... target image" (its buffer was exchanged for one that does not hold the
+/// run), and "stopped" after a stop request, with the rows before it written.
 class VORL_API opPixelRescale : public OpBase {
  public:
   opPixelRescale();

@@ -10,6 +10,7 @@
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/BackProjection.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
 #include <vorl/Operators/IP/kernels/Slab.h>
 #include <vorl/Operators/IP/kernels/VolumeProjection.h>
@@ -112,7 +113,7 @@ bool opSliceProjection::Prepare() {
     m_status.Set(false, "Z-Buffer is incompatible to 'Projection Plane'");
   } else {
     m_status = true;
-    return !m_stopRequested;
+    return m_stopRequested ? Stopped() : true;
   }
   return false;
 }
@@ -127,6 +128,14 @@ bool opSliceProjection::Process() {
   const bool readsVolume =
       algoID == SliceProjectionAlgo_Volume || algoID == SliceProjectionAlgo_VoxelList;
   if (readsVolume && !vorl_detail::CheckPixels(*volume, m_status)) {
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(projectionPlane->GetImage()) || !vorl_detail::HoldsRows(zBuffer)) {
+    m_status.Set(false, "invalid pixel data in the Projection Plane");
+    return false;
+  }
+  if (algoID == SliceProjectionAlgo_Slice && !vorl_detail::HoldsRows(slice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the Slice");
     return false;
   }
   bool ok = true;

@@ -130,7 +130,7 @@ bool opVoxelClassification::Prepare() {
       break;
   }
   m_status = true;
-  return !m_stopRequested;
+  return m_stopRequested ? Stopped() : true;
 }
 
 bool opVoxelClassification::AllocateCounters() {

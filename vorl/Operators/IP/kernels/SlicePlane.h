@@ -19,10 +19,10 @@ struct SlicePlane {
     dVect3D corner;
     corner.Set(0.0, 0.0, depth);
     toVolume.pS2T(corner);
-    start = FixedVector::Of(corner);
-    columnStep = FixedVector::Of(toVolume.s2t[0]);
-    rowStep = FixedVector::Of(toVolume.s2t[1]);
-    depthStep = FixedVector::Of(toVolume.s2t[2]);
+    start = FixedVector::Point(corner);
+    columnStep = FixedVector::Step(toVolume.s2t[0]);
+    rowStep = FixedVector::Step(toVolume.s2t[1]);
+    depthStep = FixedVector::Step(toVolume.s2t[2]);
   }
 
   FixedVector start;

@@ -22,10 +22,10 @@ struct GridProjection {
     const dTrafo3D toTarget(source, target);
     dVect3D corner;
     toTarget.pS2T(corner);
-    start = FixedVector::Of(corner);
-    columnX = FixedVector::Of(toTarget.s2t[0]);
-    columnY = FixedVector::Of(toTarget.s2t[1]);
-    columnZ = FixedVector::Of(toTarget.s2t[2]);
+    start = FixedVector::Point(corner);
+    columnX = FixedVector::Step(toTarget.s2t[0]);
+    columnY = FixedVector::Step(toTarget.s2t[1]);
+    columnZ = FixedVector::Step(toTarget.s2t[2]);
   }
 
   FixedVector operator()(const VoxelAddress& voxel) const {

@@ -1,5 +1,7 @@
 #include <vorl/Operators/IP/kernels/VolumeView.h>
 
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
+
 inline namespace vorl {
 namespace vorl_detail {
 
@@ -13,10 +15,10 @@ std::int32_t LimitOf(std::int32_t size) {
   return WrapMultiply(size, 65536);
 }
 
-// Slices agree when they are added; the application may have formatted one anew since.
-bool HasFormatOf(const dImage& image, const dImage& model) {
-  return image.IsValid() && image.GetWidth() == model.GetWidth() &&
-         image.GetHeight() == model.GetHeight() && image.GetFormatID() == model.GetFormatID();
+// Size and format; rows may be padded otherwise.
+bool IsLikeFirst(const dImage& image, const dImage& first) {
+  return image.GetWidth() == first.GetWidth() && image.GetHeight() == first.GetHeight() &&
+         image.GetFormatID() == first.GetFormatID();
 }
 
 }  // namespace
@@ -41,7 +43,8 @@ VolumeView::VolumeView(const dVolume& volume)
   m_slices.push_back(first.GetDataPtr());
   for (const dSlice& slice : slices) {
     const dImage& image = slice.GetImage();
-    if (!m_invalidSlice && (!HasFormatOf(image, first) || image.GetImageSize() < neededBytes)) {
+    if (!m_invalidSlice &&
+        !(IsLikeFirst(image, first) && HoldsBytes(image, neededBytes, kSampleBytes))) {
       m_invalidSlice = static_cast<int>(m_slices.size()) - 1;
     }
     m_slices.push_back(image.GetDataPtr());
