@@ -66,8 +66,9 @@ class VORL_API dVect3D : public DataBase {
   void Scale(double factor);
   /// Multiplies each component by its factor.
   void Scale(double factorX, double factorY, double factorZ);
-  /// Each component v becomes v + (factor - 1) * (centre - v): factor 1 changes nothing, 2 moves
-  /// the vector onto the centre, 0 mirrors it through the centre.
+  /// Each component v becomes v + (factor - 1) * (centre - v): the distance from the centre is
+  /// multiplied by 2 - factor. Factor 1 changes nothing, 2 moves the vector onto the centre, 0
+  /// doubles its distance.
   void Scale(double factor, const dVect3D& centre);
   /// The same with a factor for each component.
   void Scale(double factorX, double factorY, double factorZ, const dVect3D& centre);

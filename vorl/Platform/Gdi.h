@@ -8,6 +8,8 @@
 
 #include <vorl/Platform/GdiFwd.h>
 
+#include <cstddef>
+
 #if defined(_WIN32)
 
 #if !defined(NOMINMAX)
@@ -98,11 +100,13 @@ inline constexpr unsigned int DIB_RGB_COLORS = 0;
 #endif
 
 static_assert(sizeof(BYTE) == 1 && sizeof(WORD) == 2 && sizeof(DWORD) == 4 && sizeof(LONG) == 4);
-static_assert(sizeof(tagPOINT) == 8);
-static_assert(sizeof(tagRECT) == 16);
-static_assert(sizeof(tagRGBQUAD) == 4);
-static_assert(sizeof(tagBITMAPINFOHEADER) == 40);
-static_assert(sizeof(tagBITMAPINFO) == 44);
-static_assert(sizeof(tagBITMAPFILEHEADER) == 14);
+static_assert(sizeof(tagPOINT) == 8 && offsetof(tagPOINT, y) == 4);
+static_assert(sizeof(tagRECT) == 16 && offsetof(tagRECT, right) == 8);
+static_assert(sizeof(tagRGBQUAD) == 4 && offsetof(tagRGBQUAD, rgbRed) == 2);
+static_assert(sizeof(tagBITMAPINFOHEADER) == 40 && offsetof(tagBITMAPINFOHEADER, biBitCount) == 14);
+static_assert(offsetof(tagBITMAPINFOHEADER, biCompression) == 16);
+static_assert(offsetof(tagBITMAPINFOHEADER, biClrUsed) == 32);
+static_assert(sizeof(tagBITMAPINFO) == 44 && offsetof(tagBITMAPINFO, bmiColors) == 40);
+static_assert(sizeof(tagBITMAPFILEHEADER) == 14 && offsetof(tagBITMAPFILEHEADER, bfOffBits) == 10);
 
 #endif

@@ -37,7 +37,7 @@ inline float Quotient(float a, double b) {
   return Single(static_cast<double>(a) / b);
 }
 
-/// `value` scaled about `centre`: moves towards the centre for factors greater than 1.
+/// `value` scaled about `centre`: its distance is multiplied by 2 - factor.
 inline float ScaledAbout(float value, double factor, double centre) {
   const double v = value;
   return Single(v + (factor - 1.0) * (centre - v));
