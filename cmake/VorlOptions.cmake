@@ -18,6 +18,8 @@ if(VORL_SANITIZE)
 endif()
 
 if(VORL_COVERAGE)
-  target_compile_options(vorl_options INTERFACE --coverage -fprofile-abs-path)
+  # Operators run in threads of their own: plain counters would lose counts and go negative.
+  target_compile_options(vorl_options INTERFACE
+    --coverage -fprofile-abs-path -fprofile-update=atomic)
   target_link_options(vorl_options INTERFACE --coverage)
 endif()

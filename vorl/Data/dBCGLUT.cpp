@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
 
 inline namespace vorl {
@@ -90,11 +91,13 @@ double dBCGLUT::GetGamma() const {
 }
 
 bool dBCGLUT::CalculateLUT() {
-  auto* entries = static_cast<unsigned char*>(m_table.GetDataPtr());
-  if (entries == nullptr) {
+  if (m_table.GetImageSize() < kEntries) {
+    LogContext context("dBCGLUT::CalculateLUT", __FILE__, __LINE__, true);
     m_status.Set(false, "BCG LUT is not initialized");
+    context.Status(__LINE__, m_status);
     return false;
   }
+  auto* entries = static_cast<unsigned char*>(m_table.GetDataPtr());
   const double angle = (m_contrast + 1.0) * 45.0 / 180.0 * kPi;
   const double slope = std::sin(angle) / std::max(std::cos(angle), kSmallestCos);
   double value = 256.0 - (slope + 1.0) * (1.0 - m_brightness) * 128.0;

@@ -46,7 +46,8 @@ class VORL_API dBCGLUT : public dLUT {
   /// Refuses: the format is fixed. Sets "Don't call 'Init' for a 'dBCGLUT' object. It has been
   /// initialized during construction" and returns false.
   bool Init(long size, LUTType type, int numChannels, long startIndex) override;
-  /// Computes the entries. Without storage: "BCG LUT is not initialized" and false.
+  /// Computes the entries. When the table image was made smaller or reset from outside: "BCG LUT is
+  /// not initialized" and false, with nothing written.
   bool CalculateLUT() override;
 
  private:

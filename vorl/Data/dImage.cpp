@@ -127,7 +127,13 @@ bool dImage::Init(const dImage& model, unsigned long width, unsigned long height
   return m_status.IsOK();
 }
 
-void dImage::CopyLayout(const dImage& source) {
+// Resets this image and gives it the format of `source`. The pixels stay for the transfer that
+// follows: the source may refer to them, and the buffer knows how to part from them then.
+void dImage::ResetTo(const dImage& source) {
+  dBuffer pixels;
+  pixels <<= m_buffer;
+  Reset();
+  m_buffer <<= pixels;
   m_rect = source.m_rect;
   m_numChannels = source.m_numChannels;
   m_dataType = source.m_dataType;
@@ -147,8 +153,7 @@ bool dImage::Init(DataTransferMode mode, dImage& source) {
   if (this == &source) {
     return IsValid();
   }
-  Reset();
-  CopyLayout(source);
+  ResetTo(source);
   m_buffer.Init(source.m_buffer, mode);
   if (mode == DTM_Copy && source.IsValid() && !IsValid()) {
     Reset();
@@ -166,6 +171,10 @@ dImage& dImage::operator=(const dImage& source) {
   if (this == &source) {
     return *this;
   }
+  dBuffer oldPixels;  // kept until the end where the source may refer to a part of them
+  if (source.m_buffer.IsReference() && source.GetImageSize() != GetImageSize()) {
+    oldPixels <<= m_buffer;
+  }
   if (!source.IsValid()) {
     Reset();
   } else if (Init(source, 0, 0, 0)) {
@@ -179,8 +188,7 @@ void dImage::operator<<=(dImage& source) {
   if (this == &source) {
     return;
   }
-  Reset();
-  CopyLayout(source);
+  ResetTo(source);
   m_buffer.Init(source.m_buffer, DTM_TakeOver);
   OnInit();
   source.Reset();

@@ -82,7 +82,10 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
 #endif
   /// Takes over the format and the pixels of `source`: `DTM_Copy` copies the pixels,
   /// `DTM_TakeOver` moves them and resets the source, `DTM_Reference` refers to them without owning
-  /// them. The same object: nothing changes. Returns whether the image is valid.
+  /// them. The same object: nothing changes. A source that refers to this image's own pixels, which
+  /// end here, is copied in every mode. Any other mode takes the format without the pixels. Returns
+  /// whether the image is valid; when there is no memory for a copy the image is reset ("no
+  /// memory(%d bytes required)").
   virtual bool Init(DataTransferMode mode, dImage& source);
   /// Formats the image.
   ///
@@ -111,8 +114,10 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// Writes rectangle, data type, data order, row alignment, channel sequence and pixels.
   void Write(BinaryDataOut& out) override;
   /// Reads what `Write` wrote. The position is not restored: a read image sits at (0, 0). A format
-  /// that asks for more bytes than the file still holds is a short read (-200); whenever reading
-  /// fails the image is left reset.
+  /// that asks for more bytes than the file still holds is a short read (-200), a format that
+  /// `Init` refuses fails with its status. Whenever reading fails the image is left reset, with the
+  /// status that is thrown. An empty image is read like any other, though `Init` reports that it
+  /// has no channels.
   void Read(BinaryDataIn& in) override;
 
   static dImage* Create();
@@ -125,7 +130,9 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// Sets every byte of the pixels, row padding included; false when there are none.
   bool Fill(char value);
 
-  /// A deep copy of format and pixels at position (0, 0); an invalid source resets this image.
+  /// A deep copy of format, pixels and status, at position (0, 0); an invalid source resets this
+  /// image. Pixels of the same byte size are overwritten in place, which for an image that refers
+  /// to pixels means those it refers to. `source` may refer to this image's pixels.
   dImage& operator=(const dImage& source);
   /// Moves `source` into this image; the source is reset.
   void operator<<=(dImage& source);
@@ -228,7 +235,7 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   dBuffer m_buffer;
 
  private:
-  void CopyLayout(const dImage& source);
+  void ResetTo(const dImage& source);
   void SetLayout(const vorl_detail::ImageLayout& layout);
   void ReadItems(BinaryDataIn& in);
   bool Fail(LogContext& context, int line);

@@ -22,8 +22,12 @@ void dImage::Write(BinaryDataOut& out) {
 void dImage::Read(BinaryDataIn& in) {
   try {
     ReadItems(in);
-  } catch (...) {
+  } catch (const dStatus& status) {
     Reset();  // half an image is none
+    m_status = status;
+    throw;
+  } catch (...) {
+    Reset();
     throw;
   }
 }
@@ -45,12 +49,13 @@ void dImage::ReadItems(BinaryDataIn& in) {
   if (vorl_detail::CheckImageFormat(format) == ImageFormatError::None) {
     in.RequireBytes(ImageLayout(format).totalBytes);
   }
+  m_status = true;  // an image without pixels keeps the status, which may be an old failure
   Init(rect.width, rect.height, dataType, sequence.c_str(), dataOrder, rowAlignment);
-  in.ReadBuffer(m_buffer, true);
   const bool isEmptyImage = rect.IsEmpty() && sequence.c_str()[0] == '\0';
   if (!m_status.IsOK() && !isEmptyImage) {
-    throw m_status;
+    throw dStatus(m_status);
   }
+  in.ReadBuffer(m_buffer, true);
 }
 
 }  // namespace vorl

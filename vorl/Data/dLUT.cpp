@@ -2,6 +2,7 @@
 
 #include <limits>
 
+#include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
 
 inline namespace vorl {
@@ -58,17 +59,20 @@ bool dLUT::IsValid() {
 }
 
 bool dLUT::Init(long size, LUTType type, int numChannels, long startIndex) {
+  LogContext context("dLUT::Init", __FILE__, __LINE__, true);
   Reset();
   // Negative counts turn into ones that no table can have.
   if (!m_table.Init(static_cast<unsigned long>(size), static_cast<unsigned long>(numChannels),
                     ImageTypeOf(type), "G", ImageDataOrder_Pixel, 4)) {
     m_status.Set(m_table.GetStatus(), kInitPrefix);
+    context.Status(__LINE__, m_status);
     return false;
   }
   if (!FitsStartIndex(startIndex)) {
     const unsigned long bytes = m_table.GetImageSize();
     Reset();
     m_status.Set(false, "%sno memory(%lu bytes required)", kInitPrefix, bytes);
+    context.Status(__LINE__, m_status);
     return false;
   }
   m_startIndex = static_cast<std::int32_t>(startIndex);

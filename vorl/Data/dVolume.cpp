@@ -1,5 +1,6 @@
 #include <vorl/Data/dVolume.h>
 
+#include <algorithm>
 #include <iterator>
 #include <mutex>
 
@@ -22,7 +23,10 @@ dVolume::dVolume(const dVolume& source)
 
 dVolume& dVolume::operator=(const dVolume& source) {
   if (this != &source) {
-    m_sliceList = source.m_sliceList;
+    // New slices, and the old ones freed only afterwards: slices may refer to pixels elsewhere,
+    // which are not to be overwritten, and those of the source to pixels of this volume.
+    std::list<dSlice> slices(source.m_sliceList);
+    m_sliceList.swap(slices);
     m_sliceDataArray = source.m_sliceDataArray;
     m_coordinates = source.m_coordinates;
   }
@@ -86,13 +90,22 @@ const std::list<dSlice>& dVolume::GetSliceList() const {
   return m_sliceList;
 }
 
+bool dVolume::Accepts(const dSlice& slice) const {
+  if (m_sliceList.empty()) {
+    return true;
+  }
+  const dImage& image = slice.GetImage();
+  const dImage& first = m_sliceList.front().GetImage();
+  // Its own slice would lose its pixels to the new one.
+  const auto isSlice = [&](const dSlice& own) { return &own == &slice; };
+  return image.GetWidth() == first.GetWidth() && image.GetHeight() == first.GetHeight() &&
+         image.GetFormatID() == first.GetFormatID() &&
+         std::none_of(m_sliceList.begin(), m_sliceList.end(), isSlice);
+}
+
 int dVolume::AddSlice(dSlice& slice) {
-  if (IsValid()) {
-    const dSlice& first = m_sliceList.front();
-    if (slice.GetWidth() != first.GetWidth() || slice.GetHeight() != first.GetHeight() ||
-        slice.GetImage().GetFormatID() != first.GetImage().GetFormatID()) {
-      return -1;
-    }
+  if (!Accepts(slice)) {
+    return -1;
   }
   dSlice& added = m_sliceList.emplace_back();
   added.SetCoordinates(slice.GetCoordinates());

@@ -52,7 +52,7 @@ class VORL_API dVolume : public DataBase {
   const std::list<dSlice>& GetSliceList() const;
   /// Appends a slice that takes over the coordinates and the pixels of `slice`, whose image is left
   /// reset. Returns the new slice's index, or -1, without any change, when `slice` differs from the
-  /// first one in width, height or pixel format.
+  /// first one in width, height or pixel format, or already is a slice of this volume.
   int AddSlice(dSlice& slice);
 
   /// The pixel data pointers of the slices, in order; null when there are none. Entry -1 repeats
@@ -80,6 +80,8 @@ class VORL_API dVolume : public DataBase {
   void GetCenterPos(dVect3D& center) const;
 
  private:
+  bool Accepts(const dSlice& slice) const;
+
   std::list<dSlice> m_sliceList;
   dBuffer m_sliceDataArray;
   dCoordSys3D m_coordinates;

@@ -9,6 +9,7 @@ inline namespace vorl {
 namespace {
 
 constexpr int kEntries = 65536;
+constexpr unsigned long kSecondStageEntries = 256;
 
 }  // namespace
 
@@ -103,17 +104,27 @@ int dWindowingLUT::GetWinWidth() const {
   return m_width;
 }
 
-bool dWindowingLUT::CalculateLUT() {
-  auto* entries = static_cast<unsigned char*>(m_table.GetDataPtr());
-  if (entries == nullptr) {
-    return false;
+// Null when there is none, or when its table was taken away.
+const unsigned char* dWindowingLUT::FetchSecondStage() const {
+  if (m_pBCGLUT == nullptr) {
+    return nullptr;
   }
+  const unsigned char* entries = m_pBCGLUT->GetLUT(0);
+  const dImage& table = *m_pBCGLUT;
+  return table.GetImageSize() < kSecondStageEntries ? nullptr : entries;
+}
+
+bool dWindowingLUT::CalculateLUT() {
+  if (m_table.GetImageSize() < kEntries) {
+    return false;  // taken away from outside
+  }
+  auto* entries = static_cast<unsigned char*>(m_table.GetDataPtr());
   const int base = m_signedSource ? -32768 : 0;
   m_center = m_signedSource ? std::clamp(m_center, -32768, 32767) : std::clamp(m_center, 0, 65536);
   m_width = std::clamp(m_width, 2, 65536);
   const int lowerEdge = m_center - m_width / 2;
   const int upperEdge = lowerEdge + m_width;
-  const unsigned char* secondStage = m_pBCGLUT != nullptr ? m_pBCGLUT->GetLUT(0) : nullptr;
+  const unsigned char* secondStage = FetchSecondStage();
 
   const double step = static_cast<double>(m_targetHigh - m_targetLow) / m_width;
   double value = m_targetLow + 0.5;

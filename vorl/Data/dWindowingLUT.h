@@ -57,6 +57,7 @@ class VORL_API dWindowingLUT : public dLUT {
  private:
   template <class T>
   void SetValue(T& field, T value);
+  const unsigned char* FetchSecondStage() const;
 
   std::int32_t m_center = 32768;
   std::int32_t m_width = 65536;

@@ -1,0 +1,40 @@
+#ifndef VORL_VORL_H
+#define VORL_VORL_H
+
+/// @file
+/// Everything public in one include. A program that cares for its build times includes the headers
+/// that it uses.
+
+#include <vorl/Common/BaseClass.h>
+#include <vorl/Common/HRTimer.h>
+#include <vorl/Common/ILogging.h>
+#include <vorl/Common/LogContext.h>
+#include <vorl/Common/LogManager.h>
+#include <vorl/Common/OpBase.h>
+#include <vorl/Common/dStatus.h>
+#include <vorl/Data/dBCGLUT.h>
+#include <vorl/Data/dBuffer.h>
+#include <vorl/Data/dCoordSys.h>
+#include <vorl/Data/dImaDescriptorDIB.h>
+#include <vorl/Data/dImage.h>
+#include <vorl/Data/dLUT.h>
+#include <vorl/Data/dPoint.h>
+#include <vorl/Data/dRect.h>
+#include <vorl/Data/dSlice.h>
+#include <vorl/Data/dString.h>
+#include <vorl/Data/dTrafo.h>
+#include <vorl/Data/dVect2D.h>
+#include <vorl/Data/dVect3D.h>
+#include <vorl/Data/dVolume.h>
+#include <vorl/Data/dWindowingLUT.h>
+#include <vorl/IO/BinaryDataIO.h>
+#include <vorl/Operators/IP/opLookup.h>
+#include <vorl/Operators/IP/opMPR.h>
+#include <vorl/Operators/IP/opMinMax.h>
+#include <vorl/Operators/IP/opPixelRescale.h>
+#include <vorl/Platform/Gdi.h>
+#include <vorl/Platform/GdiFwd.h>
+#include <vorl/export.h>
+#include <vorl/fwd.h>
+
+#endif
