@@ -25,6 +25,13 @@ constexpr unsigned long kInitialCounterBytes = 16384;
 constexpr int kSignedBase = 32768;  // the counter of the signed value 0
 constexpr std::uint32_t kLargestLimit = std::numeric_limits<std::uint32_t>::max();
 
+// Whether a buffer holds a counter per class: the application may have exchanged it, and a copy may
+// have found no memory.
+bool HoldCounters(const dBuffer& counters, std::uint32_t classes) {
+  return counters.GetSize() / kCounterBytes >= classes &&
+         reinterpret_cast<std::uintptr_t>(counters.Get(0)) % kCounterBytes == 0;
+}
+
 // The lowest class of the highest ones that together hold at most `capacity` voxels; `lowBound`
 // when all do.
 int LowerThreshold(const std::uint32_t* counters, int lowBound, int highClass,
@@ -90,7 +97,7 @@ void opVoxelClassification::SetSelectionLimit(int voxels) {
 }
 
 void opVoxelClassification::SetSelectionLimit(double percent) {
-  if (volume == nullptr || std::isnan(percent)) {
+  if (volume == nullptr) {
     return;
   }
   // The product of the sizes wraps at 32 bits.
@@ -98,7 +105,9 @@ void opVoxelClassification::SetSelectionLimit(double percent) {
                                static_cast<std::uint32_t>(volume->GetSizeY()) *
                                static_cast<std::uint32_t>(volume->GetSizeZ());
   const double limit = voxels * (percent / 100.0);
-  selectionLimit = static_cast<std::uint32_t>(std::clamp<double>(limit, 0.0, kLargestLimit));
+  if (!std::isnan(limit)) {
+    selectionLimit = static_cast<std::uint32_t>(std::clamp<double>(limit, 0.0, kLargestLimit));
+  }
 }
 
 bool opVoxelClassification::Prepare() {
@@ -116,10 +125,11 @@ bool opVoxelClassification::Prepare() {
       return false;
     case VoxelClassificationAlgo_Value:
     case VoxelClassificationAlgo_Edge:
+      // First: where there is no memory for new counters, the old ones are gone, too.
+      classifiedBy = VoxelClassificationAlgo_None;
       if (!AllocateCounters()) {
         return false;
       }
-      classifiedBy = VoxelClassificationAlgo_None;
       break;
     case VoxelClassificationAlgo_Select:
       if (!AllocateList()) {
@@ -227,6 +237,10 @@ bool opVoxelClassification::SelectVoxels() {
     return false;
   }
   const int classes = 1 << volume->GetDataDepth();
+  if (!HoldCounters(classCounters, static_cast<std::uint32_t>(classes))) {
+    m_status.Set(false, "voxel selection error");
+    return false;
+  }
   const bool signedValues =
       dataType == ImageDataType_S16 && classifiedBy == VoxelClassificationAlgo_Value;
   const int base = signedValues ? kSignedBase : 0;

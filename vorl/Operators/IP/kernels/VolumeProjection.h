@@ -46,18 +46,14 @@ struct GridProjection {
 class RasterBounds {
  public:
   explicit RasterBounds(const dImage& image)
-      : m_width(LimitOf(image.GetWidth())), m_height(LimitOf(image.GetHeight())) {}
+      : m_width(FixedSize(static_cast<std::int32_t>(image.GetWidth()))),
+        m_height(FixedSize(static_cast<std::int32_t>(image.GetHeight()))) {}
 
   bool HoldsColumn(const FixedVector& place) const { return place.x >= 0 && place.x < m_width; }
   bool HoldsRow(const FixedVector& place) const { return place.y >= 0 && place.y < m_height; }
   bool Holds(const FixedVector& place) const { return HoldsColumn(place) && HoldsRow(place); }
 
  private:
-  // Wraps like the positions, so a limit never lies beyond the raster.
-  static std::int32_t LimitOf(unsigned long size) {
-    return WrapMultiply(static_cast<std::int32_t>(size), 65536);
-  }
-
   std::int32_t m_width;
   std::int32_t m_height;
 };

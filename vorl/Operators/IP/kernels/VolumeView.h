@@ -23,7 +23,8 @@ class VolumeView {
  public:
   explicit VolumeView(const dVolume& volume);
 
-  /// The first slice whose pixels are missing or do not hold the layout of slice 0, if any.
+  /// The first slice, if any, whose size or format is not that of slice 0, or whose pixels are too
+  /// few for its own rows or for rows as far apart as those of slice 0.
   std::optional<int> FindInvalidSlice() const { return m_invalidSlice; }
 
   /// True for a point whose voxel lies inside the volume.

@@ -55,9 +55,22 @@ struct EdgeClass {
 
 /// The part of a volume that a pass looks at.
 struct VoxelBox {
-  /// The region, or the whole volume without one, as far as it lies in a volume of these sizes. A
-  /// box that reaches the last column or row leaves `neighbours` of them out.
-  VoxelBox(const dVolume& volume, const dVOI* region, std::uint32_t neighbours);
+  /// The region, or the whole volume without one, as far as it lies in the volume. A box that
+  /// reaches the last column or row leaves `neighbours` of them out.
+  VoxelBox(const dVolume& volume, const dVOI* region, std::uint32_t neighbours) {
+    const auto width = static_cast<std::uint32_t>(volume.GetSizeX());
+    const auto height = static_cast<std::uint32_t>(volume.GetSizeY());
+    const auto depth = static_cast<std::uint32_t>(volume.GetSizeZ());
+    const dVOI box = region != nullptr ? *region : dVOI{0, 0, 0, width, height, depth};
+    firstX = box.firstX;
+    endX = EndOf(box.firstX, box.sizeX, width, neighbours);
+    firstY = box.firstY;
+    endY = EndOf(box.firstY, box.sizeY, height, neighbours);
+    firstZ = box.firstZ;
+    endZ = EndOf(box.firstZ, box.sizeZ, depth, 0);
+  }
+
+  bool IsEmpty() const { return firstX >= endX || firstY >= endY || firstZ >= endZ; }
 
   std::uint32_t firstX;
   std::uint32_t endX;
@@ -65,6 +78,14 @@ struct VoxelBox {
   std::uint32_t endY;
   std::uint32_t firstZ;
   std::uint32_t endZ;
+
+ private:
+  // The end of [first, first + size) inside [0, length), less `leftOut` at the far end of that.
+  static std::uint32_t EndOf(std::uint32_t first, std::uint32_t size, std::uint32_t length,
+                             std::uint32_t leftOut) {
+    const std::uint64_t last = length > leftOut ? length - leftOut : 0;
+    return static_cast<std::uint32_t>(std::min(std::uint64_t{first} + size, last));
+  }
 };
 
 /// Calls `visit(row)` for every row of the box, slice by slice, top to bottom. All slices are of
@@ -72,14 +93,11 @@ struct VoxelBox {
 template <class T, class Visit>
 bool ForEachVoxelRow(const RunControl& control, const dVolume& volume, const VoxelBox& box,
                      Visit&& visit) {
-  if (box.firstX >= box.endX || box.firstY >= box.endY || box.firstZ >= box.endZ) {
-    return !control.stopRequested;
-  }
   std::vector<const dImage*> images;
   for (const dSlice& slice : volume.GetSliceList()) {
     images.push_back(&slice.GetImage());
   }
-  const std::size_t rows = box.endY - box.firstY;
+  const std::size_t rows = box.IsEmpty() ? 0 : box.endY - box.firstY;
   return ForEachRow(control, rows * (box.endZ - box.firstZ), [&](std::size_t index) {
     const auto z = static_cast<std::uint32_t>(box.firstZ + index / rows);
     const auto y = static_cast<std::uint32_t>(box.firstY + index % rows);
