@@ -23,6 +23,11 @@ using vorl_detail::VolumeView;
 
 namespace {
 
+bool IsAlgorithm(std::int32_t id) {
+  return id == SliceProjectionAlgo_Slice || id == SliceProjectionAlgo_Volume ||
+         id == SliceProjectionAlgo_VoxelList || id == SliceProjectionAlgo_SliceBack;
+}
+
 // Whether a slice's pixel is drawn in the border value: the outline, and a mark of 7 x 7 pixels
 // inside it at the first one.
 bool IsBorder(std::size_t column, std::size_t row, std::size_t width, std::size_t height) {
@@ -121,21 +126,12 @@ bool opSliceProjection::Prepare() {
 bool opSliceProjection::Process() {
   const unsigned short dataType = projectionPlane->GetDataType();
   const bool isSigned = dataType == ImageDataType_S16;
-  if ((dataType != ImageDataType_U16 && !isSigned) || zBuffer.GetDataType() != ImageDataType_S16) {
+  if (!IsAlgorithm(algoID) || (dataType != ImageDataType_U16 && !isSigned)) {
+    // One text serves for an unknown algorithm, too.
     m_status.Set(false, "unsupported data type: %d", dataType);
     return false;
   }
-  const bool readsVolume =
-      algoID == SliceProjectionAlgo_Volume || algoID == SliceProjectionAlgo_VoxelList;
-  if (readsVolume && !vorl_detail::CheckPixels(*volume, m_status)) {
-    return false;
-  }
-  if (!vorl_detail::HoldsRows(projectionPlane->GetImage()) || !vorl_detail::HoldsRows(zBuffer)) {
-    m_status.Set(false, "invalid pixel data in the Projection Plane");
-    return false;
-  }
-  if (algoID == SliceProjectionAlgo_Slice && !vorl_detail::HoldsRows(slice->GetImage())) {
-    m_status.Set(false, "invalid pixel data in the Slice");
+  if (!CheckBuffers()) {
     return false;
   }
   bool ok = true;
@@ -152,16 +148,31 @@ bool opSliceProjection::Process() {
       ok = isSigned ? VoxelListProjectionS16(volume, voxelList, projectionPlane)
                     : VoxelListProjectionU16(volume, voxelList, projectionPlane);
       break;
-    case SliceProjectionAlgo_SliceBack:
+    default:
       ok = isSigned ? SliceBackProjectionS16(slice, projectionPlane)
                     : SliceBackProjectionU16(slice, projectionPlane);
       break;
-    default:
-      // One text serves for an unknown algorithm, too.
-      m_status.Set(false, "unsupported data type: %d", dataType);
-      return false;
   }
   return m_stopRequested ? Stopped() : ok;
+}
+
+// The depth buffer is the application's to exchange, as are the pixels of slices and volume.
+bool opSliceProjection::CheckBuffers() {
+  const bool readsVolume =
+      algoID == SliceProjectionAlgo_Volume || algoID == SliceProjectionAlgo_VoxelList;
+  if (readsVolume && !vorl_detail::CheckPixels(*volume, m_status)) {
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(projectionPlane->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the Projection Plane");
+  } else if (zBuffer.GetDataType() != ImageDataType_S16 || !vorl_detail::HoldsRows(zBuffer)) {
+    m_status.Set(false, "invalid pixel data in the Z Buffer");
+  } else if (algoID == SliceProjectionAlgo_Slice && !vorl_detail::HoldsRows(slice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the Slice");
+  } else {
+    return true;
+  }
+  return false;
 }
 
 template <class T>

@@ -41,8 +41,10 @@ enum SliceProjectionAlgo : std::int32_t {
 /// empty", "incompatible data types(Projection Plane: 0x%x, Volume: 0x%x", "no voxel list to
 /// project", "Z-Buffer is incompatible to 'Projection Plane'", "unsupported data type: %d" (also
 /// for an unknown algorithm), "invalid pixel data in slice %d of the Volume" (a slice whose pixels
-/// were taken away or laid out otherwise after it was added), "error while initializing the 'Z
-/// Buffer'".
+/// were taken away or laid out otherwise after it was added), "invalid pixel data in the Projection
+/// Plane", "... the Z Buffer" or "... the Slice" (its buffer was exchanged for one that does not
+/// hold its rows, or the depth buffer for one of another data type), "error while initializing the
+/// 'Z Buffer'". `SliceProjectionAlgo_SliceBack` fails without a message.
 class VORL_API opSliceProjection : public OpBase {
  public:
   opSliceProjection();
@@ -96,6 +98,7 @@ class VORL_API opSliceProjection : public OpBase {
   bool VolumeProjectionS16(dVolume* source, dSlice* plane);
 
  private:
+  bool CheckBuffers();
   template <class T>
   bool DrawSlice(const dSlice& source, dSlice& plane);
   template <class T>
