@@ -305,9 +305,9 @@ TEST(dBuffer, MethodsThatMayFailLogTheirEntry) {
   LogRecorder log;
   buffer.Init(source, DTM_Copy);
   buffer.Resize(20);
-  EXPECT_EQ(log.entries, (std::vector<std::string>{"dBuffer::Init", "dBuffer::operator = ",
-                                                   "dBuffer::New", "dBuffer::Resize",
-                                                   "dBuffer::New"}));
+  EXPECT_EQ(log.entries,
+            (std::vector<std::string>{"dBuffer::Init", "dBuffer::operator = ", "dBuffer::New",
+                                      "dBuffer::Resize", "dBuffer::New"}));
   EXPECT_TRUE(log.errors.empty());
 }
 

@@ -4,7 +4,6 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
 #include <random>
 #include <string>
 
@@ -73,15 +72,14 @@ TEST_F(dImageHostile, RefusesEveryOtherTag) {
   const ImageItems items;
   const Bytes whole = items.File();
   for (const std::size_t offset : items.TagOffsets()) {
-    for (const unsigned char tag : std::to_array<unsigned char>(
-             {0x00, 0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x07, 0x08, 0x09, 0x0A, 0x80,
-              0xE0, 0xE1, 0xE2, 0xE3, 0xE4, 0xE5, 0xF0, 0xF1, 0xF2, 0xF4, 0xFF})) {
+    for (const int tag : {0x00, 0x01, 0x02, 0x03, 0x04, 0x05, 0x06, 0x07, 0x08, 0x09, 0x0A, 0x80,
+                          0xE0, 0xE1, 0xE2, 0xE3, 0xE4, 0xE5, 0xF0, 0xF1, 0xF2, 0xF4, 0xFF}) {
       if (tag == whole[offset]) {
         continue;
       }
-      SCOPED_TRACE(testing::Message() << "offset " << offset << " tag " << int{tag});
+      SCOPED_TRACE(testing::Message() << "offset " << offset << " tag " << tag);
       Bytes changed = whole;
-      changed[offset] = tag;
+      changed[offset] = static_cast<unsigned char>(tag);
       ExpectRefused(changed, 0);
     }
   }

@@ -49,7 +49,7 @@ bool ClassInfo::CoversClass(long id) const {
 ClassInfo& BuildClassInfo(const char* name, ClassInfo* parent, ClassInfo::CreateFunction create) {
   // Never freed: objects with static lifetime may outlive any destructor run at exit.
   auto* record = new ClassInfo();
-  record->name = name;
+  record->name = name != nullptr ? name : "";
   record->create = create;
   if (parent != nullptr) {
     record->parents = new ClassInfo* [2] { parent, nullptr };

@@ -20,6 +20,10 @@ const TimerScale& ProcessScale() {
 
 }  // namespace
 
+double vorl_detail::SecondsNow() {
+  return ProcessScale().Now(SystemClock());
+}
+
 VORL_REGISTER_CLASS(HRTimer, BaseClass);
 
 HRTimer::HRTimer() : m_startTime(GetTime()) {}
@@ -39,7 +43,7 @@ bool HRTimer::IsHRSupported() {
 }
 
 double HRTimer::GetTime() const {
-  return ProcessScale().Now(SystemClock());
+  return vorl_detail::SecondsNow();
 }
 
 void HRTimer::Reset() {

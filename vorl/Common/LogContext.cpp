@@ -3,18 +3,16 @@
 #include <array>
 #include <ctime>
 
-#include <vorl/Common/HRTimer.h>
 #include <vorl/Common/LogManager.h>
 #include <vorl/Common/detail/FormatText.h>
+#include <vorl/Common/detail/TimerClock.h>
 
 inline namespace vorl {
 
-namespace {
+using vorl_detail::SecondsNow;
+using vorl_detail::StoreText;
 
-double Now() {
-  static const HRTimer clock;
-  return clock.GetTime();
-}
+namespace {
 
 const char* FileNameOf(const char* path) {
   const char* name = path;
@@ -57,11 +55,11 @@ LogContext::~LogContext() {
 void LogContext::Init(const char* title, const char* filePath, int line, bool logEntry) {
   m_line = static_cast<std::uint32_t>(line);
   m_initLine = m_line;
-  m_title = title != nullptr ? title : "";
+  StoreText(m_title, title != nullptr ? title : "");
   m_filePath = filePath != nullptr ? filePath : "";
   m_fileName = FileNameOf(m_filePath);
   m_code = 0;
-  m_logTime = Now();
+  m_logTime = SecondsNow();
   m_logThread = GetLogManager().GetLogThread();
   if (logEntry) {
     m_logThread->GetLogSession()->LogEntry(this);
@@ -71,7 +69,7 @@ void LogContext::Init(const char* title, const char* filePath, int line, bool lo
 
 void LogContext::Report(Kind kind, std::int32_t code) {
   m_code = code;
-  m_logTime = Now();
+  m_logTime = SecondsNow();
   LogSession* session = m_logThread->GetLogSession();
   switch (kind) {
     case Kind::Error:
@@ -94,7 +92,7 @@ void LogContext::Report(Kind kind, std::int32_t code) {
     va_start(arguments, format);                      \
     vorl_detail::FormatText(text, format, arguments); \
     va_end(arguments);                                \
-    m_message = text.data();                          \
+    StoreText(m_message, text.data());                \
   }                                                   \
   static_assert(true)
 
@@ -119,7 +117,7 @@ void LogContext::Warning(int line, const char* format, ...) {
 }
 
 void LogContext::Status(int line, const dStatus& status) {
-  m_message = static_cast<const char*>(status);
+  StoreText(m_message, static_cast<const char*>(status));
   m_line = static_cast<std::uint32_t>(line);
   const auto code = static_cast<std::int32_t>(static_cast<long>(status));
   Report(code < 0 ? Kind::Error : code > 0 ? Kind::Warning : Kind::Info, code);
@@ -135,7 +133,7 @@ void LogContext::LogDateTime(const char* format) {
       std::strftime(text.data(), text.size(), format, &now) == 0) {
     text[0] = '\0';
   }
-  m_message = text.data();
+  StoreText(m_message, text.data());
   m_line = 0;
   Report(Kind::Info, 0);
 }

@@ -20,8 +20,9 @@ class LogThread;
 /// line. Each report overwrites the context's record (message, code, line, time) and hands the
 /// context at once, in the calling thread, to the process's log session, which passes it to every
 /// target whose level mask admits the kind. A context that logs its entry also stands on the log
-/// stack and logs its exit when it is destroyed innermost first. Reporting never fails. Formatted
-/// messages follow the printf conventions and are cut at 1,023 characters.
+/// stack and logs its exit when it is destroyed innermost first. Reporting never fails: a text that
+/// finds no memory is dropped. Formatted messages follow the printf conventions and are cut at
+/// 1,023 characters.
 class VORL_API LogContext {
  public:
   /// No title, no file, line 0, no entry record.
@@ -45,7 +46,7 @@ class VORL_API LogContext {
   /// of the code.
   void Status(int line, const dStatus& status);
   /// Reports the current local time, formatted by the strftime conventions into at most 255
-  /// characters, as an information. A null format reports nothing.
+  /// characters, as an information. A null format reports nothing; a longer result is empty.
   void LogDateTime(const char* format);
   /// Reports the current local date as "%d-%b-%Y".
   void LogDate();
@@ -72,7 +73,8 @@ class VORL_API LogContext {
   double GetLogTime() const;
   /// The identifier of the log thread record, which is that of the process.
   unsigned long GetThreadID() const;
-  /// The open contexts, innermost first. All threads of a process share one stack.
+  /// The open contexts, innermost first. All threads of a process share one stack: it may only be
+  /// walked while no other thread logs.
   std::list<LogContext*>& GetLogStack() const;
   /// The number of open contexts.
   unsigned long GetLogDepth() const;

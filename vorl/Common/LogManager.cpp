@@ -1,12 +1,19 @@
 #include <vorl/Common/LogManager.h>
 
+#include <algorithm>
 #include <functional>
+#include <new>
+#include <vector>
 
-#include <vorl/Common/HRTimer.h>
 #include <vorl/Common/LogContext.h>
+#include <vorl/Common/detail/TimerClock.h>
+#include <vorl/Platform/detail/KillShield.h>
 #include <vorl/Platform/detail/Process.h>
 
 inline namespace vorl {
+
+using vorl_detail::KillShield;
+using vorl_detail::SecondsNow;
 
 namespace {
 
@@ -17,8 +24,13 @@ std::uint32_t NextSessionId() {
   return nextId.fetch_add(1, std::memory_order_relaxed);
 }
 
-double Now() {
-  return HRTimer().GetTime();
+// Without memory for the copy the record goes nowhere.
+std::list<ILogging*> CopyOf(const std::list<ILogging*>& targets) {
+  try {
+    return targets;
+  } catch (const std::bad_alloc&) {
+    return {};
+  }
 }
 
 // The manager exists from library load on, also when nothing asks for it.
@@ -36,8 +48,13 @@ LogSession& LogSession::operator=(const LogSession& source) = default;
 LogSession::~LogSession() = default;
 
 void LogSession::AddLogTarget(ILogging* target) {
-  if (target != nullptr) {
+  if (target == nullptr) {
+    return;
+  }
+  try {
     m_targets.push_back(target);
+  } catch (const std::bad_alloc&) {
+    return;  // as a target that nobody added
   }
 }
 
@@ -60,10 +77,12 @@ void LogSession::Dispatch(LogLevel level, void (ILogging::*call)(LogContext*),
   if (m_targets.empty() || context == nullptr) {
     return;
   }
-  for (auto target = m_targets.begin(); target != m_targets.end();) {
-    ILogging* current = *target++;  // a target may remove itself during its call
-    if ((current->GetLevelMask() & level) != 0) {
-      (current->*call)(context);
+  // A target may remove itself and others during its call.
+  const std::list<ILogging*> targets = CopyOf(m_targets);
+  for (ILogging* target : targets) {
+    const bool present = std::find(m_targets.begin(), m_targets.end(), target) != m_targets.end();
+    if (present && (target->GetLevelMask() & level) != 0) {
+      (target->*call)(context);
     }
   }
 }
@@ -87,7 +106,7 @@ void LogSession::LogExit(LogContext* context) {
 LogThread::LogThread() : LogThread(GetLogManager().GetSession(0)) {}
 
 LogThread::LogThread(LogSession* session)
-    : m_id(vorl_detail::CurrentProcessId()), m_baseTime(Now()), m_session(session) {}
+    : m_id(vorl_detail::CurrentProcessId()), m_baseTime(SecondsNow()), m_session(session) {}
 
 LogThread::LogThread(const LogThread& source)
     : m_id(source.m_id), m_baseTime(source.m_baseTime), m_session(source.m_session) {
@@ -120,17 +139,26 @@ LogSession* LogThread::GetLogSession() const {
   return m_session;
 }
 
+// The shields: a thread ended by force while it holds the lock would stop all logging for good.
+
 unsigned long LogThread::GetLogDepth() const {
+  const KillShield shield;
   const std::lock_guard lock(m_stackMutex);
   return static_cast<unsigned long>(m_stack.size());
 }
 
 void LogThread::Push(LogContext* context) {
+  const KillShield shield;
   const std::lock_guard lock(m_stackMutex);
-  m_stack.push_front(context);
+  try {
+    m_stack.push_front(context);
+  } catch (const std::bad_alloc&) {
+    return;  // the context will log no exit
+  }
 }
 
 bool LogThread::Remove(LogContext* context) {
+  const KillShield shield;
   const std::lock_guard lock(m_stackMutex);
   if (m_stack.empty() || m_stack.front() != context) {
     m_stack.remove(context);  // ended out of order: it must not stay behind as a dangling pointer
@@ -141,19 +169,23 @@ bool LogThread::Remove(LogContext* context) {
 }
 
 void LogThread::DropWithin(const void* low, const void* high) {
+  const KillShield shield;
   const std::lock_guard lock(m_stackMutex);
   const std::less<const void*> before;
   m_stack.remove_if(
       [&](const LogContext* context) { return !before(context, low) && before(context, high); });
 }
 
+// Never destroyed: in a static build an application's objects may outlive every destructor that the
+// library could run at exit, and still log from their own.
 LogManager& GetLogManager() {
-  static LogManager manager;
+  static LogManager& manager = *new LogManager();
   return manager;
 }
 
 LogManager::LogManager()
-    : m_startTime(Now()), m_creator(static_cast<std::int32_t>(vorl_detail::CurrentThreadId())) {
+    : m_startTime(SecondsNow()),
+      m_creator(static_cast<std::int32_t>(vorl_detail::CurrentThreadId())) {
   RegisterSession(kDefaultSession);
   GetLogThread();
 }
@@ -182,7 +214,7 @@ LogManager::~LogManager() {
 }
 
 LogSession* LogManager::GetSession(const char* name) const {
-  const std::string wanted = name != nullptr ? name : kDefaultSession;
+  const char* wanted = name != nullptr ? name : kDefaultSession;
   for (const auto& session : m_sessions) {
     if (session->m_name == wanted) {
       return session.get();
@@ -205,12 +237,18 @@ LogSession* LogManager::RegisterSession(const char* name) {
   if (LogSession* known = GetSession(name)) {
     return known;
   }
-  m_sessions.emplace_back(new LogSession(name != nullptr ? name : kDefaultSession));
+  try {
+    m_sessions.emplace_back(new LogSession(name != nullptr ? name : kDefaultSession));
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
   return m_sessions.back().get();
 }
 
 void LogManager::AddLogTarget(ILogging* target, const char* sessionName) {
-  RegisterSession(sessionName)->AddLogTarget(target);
+  if (LogSession* session = RegisterSession(sessionName)) {
+    session->AddLogTarget(target);
+  }
 }
 
 void LogManager::RemoveLogTarget(ILogging* target) {
@@ -225,6 +263,7 @@ LogThread* LogManager::GetLogThread() {
   if (current != nullptr && current->m_id == process) {
     return current;
   }
+  const KillShield shield;
   const std::lock_guard lock(m_logThreadsMutex);
   for (const auto& record : m_logThreads) {
     if (record->m_id == process) {

@@ -18,11 +18,16 @@ inline namespace vorl {
 class LogContext;
 class LogManager;
 
+namespace vorl_detail {
+class OperatorThread;
+}
+
 /// A named list of log targets.
 ///
 /// Records are dispatched in the reporting thread, to the targets in the order in which they were
 /// added. The session does not own its targets: an application removes a target before destroying
-/// it. Adding and removing targets is not guarded against reports from other threads.
+/// it. A target may remove targets during its call: a removed one gets no more records. Adding and
+/// removing targets is not guarded against reports from other threads.
 class VORL_API LogSession {
  public:
   /// Takes the next session identifier of the process.
@@ -83,7 +88,7 @@ class VORL_API LogThread {
  private:
   friend class LogContext;
   friend class LogManager;
-  friend class OperatorThread;
+  friend class vorl_detail::OperatorThread;
 
   explicit LogThread(LogSession* session);
   void Push(LogContext* context);
@@ -110,7 +115,8 @@ class VORL_API LogManager {
   /// Destroys the records and sessions that no copy shares; targets stay with their owners.
   virtual ~LogManager();
 
-  /// The session of this name, created when there is none. Null stands for "DEFAULT".
+  /// The session of this name, created when there is none. Null stands for "DEFAULT". Null when
+  /// memory is exhausted.
   LogSession* RegisterSession(const char* name);
   /// The session of exactly this name; null when there is none. Null stands for "DEFAULT".
   LogSession* GetSession(const char* name) const;
@@ -134,7 +140,8 @@ class VORL_API LogManager {
   std::mutex m_logThreadsMutex;
 };
 
-/// The one manager of the process.
+/// The one manager of the process. It exists from the loading of the library on and outlives every
+/// static object, so destructors that run at exit may log.
 VORL_API LogManager& GetLogManager();
 
 }  // namespace vorl

@@ -1,83 +1,40 @@
 #include <vorl/Common/OpBase.h>
 
-#include <chrono>
-
-#include <vorl/Common/LogManager.h>
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Common/detail/OperatorThread.h>
 
 inline namespace vorl {
 
-namespace {
-
-constexpr std::chrono::milliseconds kStopGrace(100);
-
-}  // namespace
-
-std::shared_ptr<OperatorThread> OperatorThread::Start(OpBase& owner) {
-  std::shared_ptr<OperatorThread> self(new OperatorThread(owner));
-  self->m_thread = vorl_detail::Thread::Start([self] { self->Body(); });
-  return self->m_thread != nullptr ? self : nullptr;
-}
-
-void OperatorThread::Body() {
-  m_published.wait(false);
-  const bool ok = m_owner.Run();
-  m_owner.m_running = false;  // an overridden `Run` need not have ended the run
-  if (ok) {
-    m_released = true;
-  }
-}
-
-void OperatorThread::End() {
-  if (m_thread->IsCurrent()) {
-    m_owner.m_running = false;
-    m_released = true;
-    DropLogContexts();
-    vorl_detail::Thread::ExitCurrent();
-  }
-  // Only an owner that lives has a thread that has not ended.
-  if (!m_thread->WaitFor(std::chrono::milliseconds(0))) {
-    m_owner.m_stopRequested = true;
-    if (!m_thread->WaitFor(kStopGrace)) {
-      m_thread->Kill();
-      DropLogContexts();
-    }
-    m_owner.m_running = false;
-    m_owner.m_stopRequested = false;
-  }
-  m_thread->Join();
-  m_released = true;
-}
-
-// Contexts on the stack of a thread that never unwound would stay on the log stack for good.
-void OperatorThread::DropLogContexts() {
-  GetLogManager().GetLogThread()->DropWithin(m_thread->StackLow(), m_thread->StackHigh());
-}
+using vorl_detail::OperatorThread;
 
 VORL_REGISTER_ABSTRACT_CLASS(OpBase, BaseClass);
 
 OpBase::OpBase() = default;
 
-OpBase::OpBase(const OpBase& source) : BaseClass(source) {
-  *this = source;
+OpBase::OpBase(const OpBase& source)
+    : BaseClass(source), m_status(source.m_status), m_timer(source.m_timer) {
+  CopyRun(source);
 }
 
 OpBase& OpBase::operator=(const OpBase& source) {
   if (this != &source) {
-    if (m_thread != source.m_thread) {
+    if (m_thread != nullptr && m_thread != source.m_thread && m_thread->BelongsTo(*this)) {
       OpBase::Terminate();  // nobody else would end it
     }
     m_status = source.m_status;
     m_timer = source.m_timer;
-    m_thread = source.m_thread;
-    m_running = source.m_running.load();
-    m_launching = false;
-    m_stopRequested = source.m_stopRequested.load();
-    m_processingTime = source.m_processingTime.load();
-    m_progress = source.m_progress.load();
+    CopyRun(source);
   }
   return *this;
+}
+
+void OpBase::CopyRun(const OpBase& source) {
+  m_thread = source.m_thread;
+  m_running = source.m_running.load();
+  m_launching = false;
+  m_stopRequested = source.m_stopRequested.load();
+  m_processingTime = source.m_processingTime.load();
+  m_progress = source.m_progress.load();
 }
 
 OpBase::~OpBase() {
@@ -98,12 +55,17 @@ bool OpBase::Run() {
 }
 
 void OpBase::Start() {
-  m_running = true;
-  // A stop request that came between `RunAsThread` and now is meant for this run.
+  // A run in its own thread began with `RunAsThread`: its time counts from there, and a stop
+  // request that came since then is meant for it.
   if (!m_launching.exchange(false)) {
     m_stopRequested = false;
+    ResetProgress();
   }
   m_status = true;
+  m_running = true;
+}
+
+void OpBase::ResetProgress() {
   m_progress = 0.0;
   m_processingTime = 0.0;
   m_timer.Reset();
@@ -142,16 +104,15 @@ bool OpBase::RunAsThread(int) {
   }
   OpBase::Terminate();  // an earlier thread has ended its run and is at most about to return
   m_stopRequested = false;
-  m_launching = true;
-  m_running = true;
   m_thread = OperatorThread::Start(*this);
   if (m_thread == nullptr) {
-    m_launching = false;
-    m_running = false;
     return false;
   }
-  m_thread->m_published = true;
-  m_thread->m_published.notify_one();
+  // From here on the owner sees a running operator, though the thread has yet to come to `Start`.
+  ResetProgress();
+  m_launching = true;
+  m_running = true;
+  m_thread->Publish();
   return true;
 }
 

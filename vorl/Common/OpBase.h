@@ -12,7 +12,9 @@
 
 inline namespace vorl {
 
+namespace vorl_detail {
 class OperatorThread;
+}
 
 /// The base of all operators.
 ///
@@ -24,11 +26,13 @@ class OperatorThread;
 /// `GetProcessingTime`, and call `Stop` or `Terminate`; it must not touch the inputs, read the
 /// status or start another run. A derived class whose thread may still run when it is destroyed
 /// calls `Terminate` first thing in its destructor: the base's own call comes after the derived
-/// part is gone.
+/// part is gone. An exception that leaves a run ends the process when the run has its own thread.
 class VORL_API OpBase : public BaseClass {
  public:
   OpBase();
-  /// Copies every field; copies share the thread of their source.
+  /// Copies every field. A copy shares the thread of its source: its `Terminate`, which its
+  /// destructor calls too, ends that thread. An assignment first ends a thread that this operator
+  /// started.
   OpBase(const OpBase& source);
   OpBase& operator=(const OpBase& source);
 
@@ -83,12 +87,14 @@ class VORL_API OpBase : public BaseClass {
   std::atomic<double> m_progress{0.0};
 
  private:
-  friend class OperatorThread;
+  friend class vorl_detail::OperatorThread;
 
+  void CopyRun(const OpBase& source);
+  void ResetProgress();
   bool HasThread() const;
 
   mutable HRTimer m_timer;
-  std::shared_ptr<OperatorThread> m_thread;
+  std::shared_ptr<vorl_detail::OperatorThread> m_thread;
   std::atomic<bool> m_running{false};
   std::atomic<bool> m_launching{false};  ///< between `RunAsThread` and the thread's `Start`
   std::atomic<double> m_processingTime{0.0};

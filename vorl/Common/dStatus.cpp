@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <limits>
-#include <new>
 #include <ostream>
 
 #include <vorl/Common/detail/ClassRegistration.h>
@@ -26,6 +25,9 @@ std::int32_t CodeOf(long code) {
 
 }  // namespace
 
+using vorl_detail::AppendText;
+using vorl_detail::StoreText;
+
 // Formats the variable arguments behind `format` into a local FormatBuffer named `text`.
 #define VORL_FORMAT_ARGUMENTS(text, format)           \
   vorl_detail::FormatBuffer text;                     \
@@ -43,15 +45,16 @@ dStatus::dStatus() : m_code(kFailure) {}
 dStatus::dStatus(long code, const char* text) : m_code(CodeOf(code)) {
   vorl_detail::FormatBuffer formatted;
   vorl_detail::FormatTextWithoutArguments(formatted, text);
-  Assign(m_code, formatted.data());
+  StoreText(m_message, formatted.data());
 }
 
 dStatus::dStatus(bool ok, const char* text) : dStatus(static_cast<long>(CodeOf(ok)), text) {}
 
 dStatus::dStatus(int code, const char* text) : dStatus(static_cast<long>(code), text) {}
 
-dStatus::dStatus(const dStatus& source)
-    : DataBase(source), m_code(source.m_code), m_message(source.m_message) {}
+dStatus::dStatus(const dStatus& source) : DataBase(source), m_code(source.m_code) {
+  StoreText(m_message, source.m_message);
+}
 
 dStatus::~dStatus() = default;
 
@@ -64,19 +67,10 @@ bool dStatus::IsValid() {
   return true;
 }
 
-// A text that finds no memory is dropped: the code, which callers act on, is kept.
-void dStatus::Assign(std::int32_t code, const char* text) noexcept {
-  m_code = code;
-  try {
-    m_message.assign(text != nullptr ? text : "");
-  } catch (const std::bad_alloc&) {
-    m_message.clear();
-  }
-}
-
 dStatus& dStatus::operator=(const dStatus& source) {
   if (this != &source) {
-    Assign(source.m_code, source.m_message.c_str());
+    m_code = source.m_code;
+    StoreText(m_message, source.m_message);
   }
   return *this;
 }
@@ -100,24 +94,22 @@ dStatus& dStatus::operator=(bool ok) {
 }
 
 dStatus& dStatus::operator=(const char* text) {
-  Assign(m_code, text);
+  StoreText(m_message, text != nullptr ? text : "");
   return *this;
 }
 
 dStatus& dStatus::operator=(const std::string& text) {
-  m_message = text;
+  StoreText(m_message, text);
   return *this;
 }
 
 dStatus& dStatus::operator+=(const char* text) {
-  if (text != nullptr) {
-    m_message += text;
-  }
+  AppendText(m_message, text != nullptr ? text : "");
   return *this;
 }
 
 dStatus& dStatus::operator+=(const std::string& text) {
-  m_message += text;
+  AppendText(m_message, text);
   return *this;
 }
 
@@ -160,34 +152,40 @@ bool dStatus::IsOK() const {
 
 void dStatus::Set(const dStatus& cause, const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  const std::string causeMessage = cause.m_message;  // `cause` may be this status
-  Assign(cause.m_code, text.data());
-  m_message += causeMessage;
+  std::string causeMessage;  // `cause` may be this status
+  StoreText(causeMessage, cause.m_message);
+  m_code = cause.m_code;
+  StoreText(m_message, text.data());
+  AppendText(m_message, causeMessage);
 }
 
 void dStatus::Set(long code, const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  Assign(CodeOf(code), text.data());
+  m_code = CodeOf(code);
+  StoreText(m_message, text.data());
 }
 
 void dStatus::Set(int code, const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  Assign(code, text.data());
+  m_code = code;
+  StoreText(m_message, text.data());
 }
 
 void dStatus::Set(bool ok, const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  Assign(CodeOf(ok), text.data());
+  m_code = CodeOf(ok);
+  StoreText(m_message, text.data());
 }
 
 void dStatus::SetMsg(const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  Assign(kSuccess, text.data());
+  m_code = kSuccess;
+  StoreText(m_message, text.data());
 }
 
 void dStatus::AddMsg(const char* format, ...) {
   VORL_FORMAT_ARGUMENTS(text, format);
-  m_message += text.data();
+  AppendText(m_message, text.data());
 }
 
 std::ostream& operator<<(std::ostream& out, const dStatus& status) {

@@ -17,7 +17,8 @@ inline namespace vorl {
 /// Code 0 is success, a negative code an error, a positive code a warning. Booleans map to 0
 /// (true) and -1 (false). Formatted texts follow the printf conventions and are cut at 1,023
 /// characters; a null or empty format gives an empty text. Codes are held in 32 bits; a larger
-/// value is stored as the nearest one that fits.
+/// value is stored as the nearest one that fits. A text that finds no memory is dropped; the code,
+/// which callers act on, is always kept.
 class VORL_API dStatus : public DataBase {
  public:
   /// Code -1, empty message: nothing has been reported yet.
@@ -86,8 +87,6 @@ class VORL_API dStatus : public DataBase {
   void AddMsg(const char* format, ...) VORL_PRINTF_FORMAT(2, 3);
 
  private:
-  void Assign(std::int32_t code, const char* text) noexcept;
-
   std::int32_t m_code;
   std::string m_message;
 };

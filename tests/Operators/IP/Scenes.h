@@ -5,6 +5,7 @@
 /// Random volumes and planes that stress the volume operators.
 
 #include <array>
+#include <sstream>
 #include <string>
 
 #include "Volumes.h"
@@ -107,14 +108,18 @@ inline void PlacePlane(dSlice& slice, const dVolume& volume, Random& random) {
 
 /// Sizes and places, for the text of a failure.
 inline std::string TextOf(const dVolume& volume, const dSlice& slice) {
-  const auto text = [](const dVect3D& v) {
-    return "(" + std::to_string(v.x) + " " + std::to_string(v.y) + " " + std::to_string(v.z) + ")";
+  std::ostringstream text;
+  const auto put = [&](const char* name, const dVect3D& v) {
+    text << ", " << name << " (" << v.x << ' ' << v.y << ' ' << v.z << ')';
   };
+  text << volume.GetSizeX() << " x " << volume.GetSizeY() << " x " << volume.GetSizeZ() << " to "
+       << slice.GetWidth() << " x " << slice.GetHeight();
   const dCoordSys3D& plane = slice.GetCoordinates();
-  return std::to_string(volume.GetSizeX()) + " x " + std::to_string(volume.GetSizeY()) + " x " +
-         std::to_string(volume.GetSizeZ()) + " to " + std::to_string(slice.GetWidth()) + " x " +
-         std::to_string(slice.GetHeight()) + ", plane " + text(plane.origin) + text(plane.axisX) +
-         text(plane.axisY) + text(plane.axisZ);
+  put("at", plane.origin);
+  put("axisX", plane.axisX);
+  put("axisY", plane.axisY);
+  put("axisZ", plane.axisZ);
+  return text.str();
 }
 
 }  // namespace rasters

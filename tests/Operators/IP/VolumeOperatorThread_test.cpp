@@ -7,22 +7,16 @@
 #include <thread>
 
 #include "ThreadJobs.h"
+#include "Waiting.h"
 
 namespace {
 
 using rasters::MessageOf;
 using thread_jobs::Amount;
 using thread_jobs::Job;
+using waiting::WaitForEnd;
+using waiting::WaitForProgress;
 using namespace std::chrono_literals;
-
-/// Returns when the operator's run has ended; false when that takes too long.
-bool WaitForEnd(const OpBase& op) {
-  const auto deadline = std::chrono::steady_clock::now() + 120s;
-  while (op.IsRunning() && std::chrono::steady_clock::now() < deadline) {
-    std::this_thread::sleep_for(100us);
-  }
-  return !op.IsRunning();
-}
 
 class VolumeOperatorThread : public testing::TestWithParam<int> {
  protected:
@@ -64,14 +58,12 @@ TEST_P(VolumeOperatorThread, ProgressRisesFromZeroToOne) {
 
 // The row that is being worked on when the request comes is finished, and no other is begun.
 TEST_P(VolumeOperatorThread, StopsWithinOneRow) {
-  const auto job = MakeJob(Amount::Large);
-  OpBase& op = job->Op();
-  // Should the machine be so busy that the work is done before the request comes, it comes again.
+  // Should the machine be so busy that the work is done before the request comes, it is tried again.
   for (int attempt = 0; attempt < 20; ++attempt) {
+    const auto job = MakeJob(Amount::Large);
+    OpBase& op = job->Op();
     ASSERT_TRUE(op.RunAsThread(0));
-    while (op.IsRunning() && op.GetProgress() == 0.0) {
-      std::this_thread::yield();
-    }
+    ASSERT_TRUE(WaitForProgress(op));
     op.Stop();
     const double asked = op.GetProgress();
     ASSERT_TRUE(WaitForEnd(op));
@@ -125,9 +117,7 @@ TEST(VolumeOperatorThreadClasses, StoppedClassificationsAreNoneToSelectFrom) {
   thread_jobs::ClassificationJob job(401, Amount::Large);
   auto& op = static_cast<opVoxelClassification&>(job.Op());
   ASSERT_TRUE(op.RunAsThread(0));
-  while (op.IsRunning() && op.GetProgress() == 0.0) {
-    std::this_thread::yield();
-  }
+  ASSERT_TRUE(WaitForProgress(op));
   op.Stop();
   ASSERT_TRUE(WaitForEnd(op));
   ASSERT_EQ(MessageOf(op), "stopped");

@@ -75,9 +75,9 @@ class Case {
     m_op.SetDepthSteps(random.Pick(kDepthSteps));
   }
 
-  std::string Text() const {
-    return "algorithm " + std::to_string(m_op.algoID) + ", depth steps " +
-           std::to_string(m_op.depthSteps) + ", " + rasters::TextOf(m_volume, m_slice);
+  testing::Message Text() const {
+    return testing::Message() << "algorithm " << m_op.algoID << ", depth steps " << m_op.depthSteps
+                              << ", " << rasters::TextOf(m_volume, m_slice);
   }
 
   void Check(Coverage& coverage) {

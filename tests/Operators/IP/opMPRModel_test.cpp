@@ -32,9 +32,9 @@ class Case {
     m_op.SetDepthSteps(random.Pick(kDepthSteps));
   }
 
-  std::string Text() const {
-    return "algorithm " + std::to_string(m_op.algoID) + ", depth steps " +
-           std::to_string(m_op.depthSteps) + ", " + rasters::TextOf(m_volume, m_slice);
+  testing::Message Text() const {
+    return testing::Message() << "algorithm " << m_op.algoID << ", depth steps " << m_op.depthSteps
+                              << ", " << rasters::TextOf(m_volume, m_slice);
   }
 
   void Check(Coverage& coverage) {
@@ -68,7 +68,7 @@ void CheckCases(unsigned short type, std::uint32_t seed) {
   Coverage coverage;
   for (int i = 0; i < 1000; ++i) {
     Case<T> testCase(type, random);
-    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase.Text());
+    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase);
     testCase.Check(coverage);
     if (testing::Test::HasFatalFailure()) {
       return;

@@ -2,6 +2,9 @@
 
 #include <cstddef>
 #include <cstdio>
+#include <exception>
+
+#include <vorl/Platform/detail/KillShield.h>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -27,6 +30,24 @@ void FormatTextWithoutArguments(FormatBuffer& buffer, const char* format) {
     }
   }
   buffer[length] = '\0';
+}
+
+void StoreText(std::string& text, std::string_view value) noexcept {
+  const KillShield shield;
+  try {
+    text = value;
+  } catch (const std::exception&) {
+    text.clear();
+  }
+}
+
+void AppendText(std::string& text, std::string_view addition) noexcept {
+  const KillShield shield;
+  try {
+    text += addition;
+  } catch (const std::exception&) {
+    return;
+  }
 }
 
 }  // namespace vorl_detail

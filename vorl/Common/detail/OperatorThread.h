@@ -8,16 +8,20 @@
 #include <vorl/Platform/detail/Thread.h>
 
 inline namespace vorl {
+namespace vorl_detail {
 
 /// The thread of an operator, shared by the copies of the operator that started it.
 class OperatorThread {
  public:
-  /// Runs `owner` in a new thread; null when the system has none to give. `owner` must live until
-  /// the thread has ended, which its destructor sees to.
+  /// Makes a thread that will run `owner` after `Publish`; null when the system has none to give.
+  /// `owner` must live until the thread has ended, which its destructor sees to.
   static std::shared_ptr<OperatorThread> Start(OpBase& owner);
 
+  /// Lets the run begin, once the owner knows its thread.
+  void Publish();
   /// True while the handle counts as open: the run goes on, or it has failed.
   bool IsOpen() const { return !m_released; }
+  bool BelongsTo(const OpBase& op) const { return &m_owner == &op; }
   /// Ends the thread and returns when it is gone; called in the thread itself, it does not return.
   void End();
 
@@ -26,13 +30,13 @@ class OperatorThread {
   void Body();
   void DropLogContexts();
 
-  OpBase& m_owner;
-  std::unique_ptr<vorl_detail::Thread> m_thread;
-  std::atomic<bool> m_published{false};  ///< `m_thread` and the owner's handle are set
+  OpBase& m_owner;  ///< dangles once the thread has ended
+  std::unique_ptr<Thread> m_thread;
+  std::atomic<bool> m_published{false};
   std::atomic<bool> m_released{false};
-  friend class OpBase;
 };
 
+}  // namespace vorl_detail
 }  // namespace vorl
 
 #endif

@@ -29,6 +29,9 @@ struct TimerScale {
   }
 };
 
+/// The current time of the machine's clock in seconds, as `HRTimer` gives it.
+double SecondsNow();
+
 }  // namespace vorl_detail
 }  // namespace vorl
 

@@ -16,7 +16,8 @@ namespace vorl_detail {
 /// must then keep alive what it needs.
 class Thread {
  public:
-  /// Starts a thread that runs `body`; null when the system has no thread to give.
+  /// Starts a thread that runs `body`, which must not throw; null when the system has no thread or
+  /// no memory to give.
   static std::unique_ptr<Thread> Start(std::function<void()> body);
 
   Thread(const Thread&) = delete;
@@ -29,15 +30,17 @@ class Thread {
   bool IsCurrent() const;
   /// Waits until the body has ended, at most so long; returns whether it has ended.
   bool WaitFor(std::chrono::milliseconds timeout) const;
-  /// Ends the thread wherever it is, without running destructors of what stands on its stack, and
-  /// returns when it is gone. What it had locked stays locked, what it had allocated is lost.
+  /// Ends the thread wherever it is, but for a `KillShield`, and returns when its body has ended.
+  /// No destructor of what stands on its stack runs: what it had locked stays locked, what it had
+  /// allocated is lost. Its stack stays in memory until `Join`, where the system allows.
   void Kill();
-  /// Waits until the thread is gone.
+  /// Waits until the thread is gone and lets go of it; again is harmless.
   void Join();
   /// Ends the calling thread, which must be one of ours, as `Kill` would; does not return.
   [[noreturn]] static void ExitCurrent();
 
-  /// The thread's stack: its lowest address and the first behind it.
+  /// The thread's stack: its lowest address and the first behind it; both null where the system
+  /// does not tell.
   const void* StackLow() const;
   const void* StackHigh() const;
 

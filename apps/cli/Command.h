@@ -1,0 +1,68 @@
+#ifndef VORL_APPS_CLI_COMMAND_H
+#define VORL_APPS_CLI_COMMAND_H
+
+/// @file
+/// What all commands of the tool have in common.
+
+#include <cli/Console.h>
+
+#include <CLI/CLI.hpp>
+
+#include <memory>
+#include <stdexcept>
+#include <string>
+
+namespace cli {
+
+/// The command line is wrong: the tool says so and ends with code 2. The text is one line without a
+/// final full stop.
+class UsageError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+/// How a command presents itself in the help.
+struct CommandText {
+  std::string name;
+  std::string summary;   ///< one line
+  std::string usage;     ///< what follows the command's name; several lines are several forms
+  std::string examples;  ///< whole lines
+};
+
+/// One command of the tool. Constructing it declares its options; after the command line has been
+/// parsed, `Check` turns their texts into values, and `Run` does the work.
+class Command {
+ public:
+  Command(CLI::App& application, const CommandText& text);
+  virtual ~Command() = default;
+  Command(const Command&) = delete;
+  Command& operator=(const Command&) = delete;
+
+  /// True when the command line names this command.
+  bool IsChosen() const { return m_app->parsed(); }
+  std::string GetName() const { return m_app->get_name(); }
+  bool IsQuiet() const { return m_quiet; }
+  /// Looks at everything that can be judged without opening a file. Throws `UsageError`.
+  virtual void Check() = 0;
+  /// Throws `study::Error`.
+  virtual void Run(Console& console) = 0;
+
+ protected:
+  /// Adds an option that takes one text.
+  CLI::Option* AddText(const std::string& names, std::string& target, const std::string& type,
+                       const std::string& description, const std::string& group);
+  CLI::App& GetApp() { return *m_app; }
+
+ private:
+  CLI::App* m_app;
+  bool m_quiet = false;
+};
+
+std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
+std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
+std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
+std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
+
+}  // namespace cli
+
+#endif

@@ -1,0 +1,8 @@
+#include <cli/Application.h>
+
+#include <string>
+#include <vector>
+
+int main(int argc, char** argv) {
+  return cli::RunApplication(std::vector<std::string>(argv + (argc > 0 ? 1 : 0), argv + argc));
+}

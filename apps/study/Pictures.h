@@ -1,0 +1,28 @@
+#ifndef VORL_APPS_STUDY_PICTURES_H
+#define VORL_APPS_STUDY_PICTURES_H
+
+/// @file
+/// Saving images as picture files.
+
+#include <vorl/Data/dImage.h>
+
+#include <filesystem>
+
+namespace study {
+
+/// Writes an image as PNG or BMP, by the extension of `path` (".png" or ".bmp", in any case).
+///
+/// Images have 8 bits and one channel (grey), or the channel sequence "BGR" in pixel order
+/// (colour); PNG also takes unsigned 16-bit grey. Rows may have any alignment. The file appears
+/// only when it is complete; an earlier one of this name is replaced. Throws `Error` for another
+/// extension, for an image that cannot be written so, and when the writing fails (a full disk, for
+/// instance).
+void SavePicture(const dImage& image, const std::filesystem::path& path);
+
+/// The same with the kind chosen by name rather than by extension.
+void SavePng(const dImage& image, const std::filesystem::path& path);
+void SaveBmp(const dImage& image, const std::filesystem::path& path);
+
+}  // namespace study
+
+#endif

@@ -1,0 +1,50 @@
+#include <tests/Support/Allocation.h>
+
+#include <chrono>
+#include <cstddef>
+#include <cstdlib>
+#include <new>
+#include <thread>
+
+namespace {
+
+thread_local bool failing = false;
+thread_local int delay = 0;
+
+}  // namespace
+
+AllocationFailure::AllocationFailure() {
+  failing = true;
+}
+
+AllocationFailure::~AllocationFailure() {
+  failing = false;
+}
+
+AllocationDelay::AllocationDelay(int milliseconds) {
+  delay = milliseconds;
+}
+
+AllocationDelay::~AllocationDelay() {
+  delay = 0;
+}
+
+// The array and non-throwing forms of the standard library come here as well.
+void* operator new(std::size_t size) {
+  if (delay > 0) {
+    std::this_thread::sleep_for(std::chrono::milliseconds(delay));
+  }
+  void* memory = failing ? nullptr : std::malloc(size != 0 ? size : 1);
+  if (memory == nullptr) {
+    throw std::bad_alloc();
+  }
+  return memory;
+}
+
+void operator delete(void* memory) noexcept {
+  std::free(memory);
+}
+
+void operator delete(void* memory, std::size_t) noexcept {
+  std::free(memory);
+}

@@ -1,0 +1,23 @@
+#ifndef VORL_TESTS_SUPPORT_ALLOCATION_H
+#define VORL_TESTS_SUPPORT_ALLOCATION_H
+
+/// While one lives, `new` finds no memory in the thread that made it. Works in executables that
+/// link Allocation.cpp.
+class AllocationFailure {
+ public:
+  AllocationFailure();
+  AllocationFailure(const AllocationFailure&) = delete;
+  AllocationFailure& operator=(const AllocationFailure&) = delete;
+  ~AllocationFailure();
+};
+
+/// While one lives, `new` takes so many milliseconds in the thread that made it.
+class AllocationDelay {
+ public:
+  explicit AllocationDelay(int milliseconds);
+  AllocationDelay(const AllocationDelay&) = delete;
+  AllocationDelay& operator=(const AllocationDelay&) = delete;
+  ~AllocationDelay();
+};
+
+#endif
