@@ -1,9 +1,6 @@
 #include <vorl/Data/dASCIIStream.h>
 
 #include <gtest/gtest.h>
-#include <vorl/Common/ILogging.h>
-#include <vorl/Common/LogContext.h>
-#include <vorl/Common/LogManager.h>
 
 #include <algorithm>
 #include <filesystem>
@@ -11,20 +8,11 @@
 #include <string>
 #include <vector>
 
+#include "../Support/LogRecorder.h"
+
 namespace {
 
 namespace fs = std::filesystem;
-
-/// Remembers the errors that are logged, each as "title: message".
-class ErrorRecorder : public LogTarget {
- public:
-  ErrorRecorder() { GetLogManager().AddLogTarget(this, nullptr); }
-  ~ErrorRecorder() override { GetLogManager().RemoveLogTarget(this); }
-  void OnError(LogContext* context) override {
-    errors.push_back(std::string(context->GetTitle()) + ": " + context->GetMsg());
-  }
-  std::vector<std::string> errors;
-};
 
 class dASCIIStreamFile : public testing::Test {
  protected:
@@ -144,7 +132,7 @@ TEST_F(dASCIIStreamFile, GetStringBeyondTheEndGivesWhatIsThereAndFails) {
 
 TEST_F(dASCIIStreamFile, MissingFileIsNamed) {
   const std::string path = m_path + ".missing";
-  ErrorRecorder log;
+  LogRecorder log;
   dASCIIStreamIn stream;
   EXPECT_FALSE(stream.Init(path.c_str(), 4));
   EXPECT_EQ(static_cast<long>(stream.GetStatus()), -1);
@@ -155,7 +143,7 @@ TEST_F(dASCIIStreamFile, MissingFileIsNamed) {
 }
 
 TEST_F(dASCIIStreamFile, ParametersMustBeGiven) {
-  ErrorRecorder log;
+  LogRecorder log;
   dASCIIStreamIn stream;
   EXPECT_FALSE(stream.Init(nullptr, 4));
   EXPECT_STREQ(stream.GetStatus(), "invalid parameter");
@@ -169,10 +157,30 @@ TEST_F(dASCIIStreamFile, ParametersMustBeGiven) {
 
 TEST_F(dASCIIStreamFile, FolderCannotBeOpened) {
   const std::string folder = fs::path(testing::TempDir()).string();
+  LogRecorder log;
   dASCIIStreamIn stream;
   EXPECT_FALSE(stream.Init(folder.c_str(), 4));
   EXPECT_STREQ(stream.GetStatus(), ("can't to open '" + folder + "'").c_str());
+  EXPECT_EQ(log.errors,
+            std::vector<std::string>{"dASCIIStreamIn::Init: can't to open '" + folder + "'"});
+  EXPECT_FALSE(stream.IsValid());
 }
+
+#if !defined(_WIN32)
+TEST_F(dASCIIStreamFile, FileWithoutReadPermissionIsNamed) {
+  fs::permissions(m_path, fs::perms::none);
+  if (std::ifstream(m_path).is_open()) {
+    GTEST_SKIP() << "this user may read every file";
+  }
+  LogRecorder log;
+  dASCIIStreamIn stream;
+  EXPECT_FALSE(stream.Init(m_path.c_str(), 4));
+  EXPECT_STREQ(stream.GetStatus(), ("no read permission for '" + m_path + "'").c_str());
+  EXPECT_EQ(log.errors, std::vector<std::string>{"dASCIIStreamIn::CheckFile: no read permission "
+                                                 "for '" +
+                                                 m_path + "'"});
+}
+#endif
 
 TEST_F(dASCIIStreamFile, EmptyFileHasNothingToRead) {
   Write("");
@@ -218,7 +226,7 @@ TEST_F(dASCIIStreamFile, InitAgainForgetsTheFileBefore) {
 }
 
 TEST(dASCIIStreamIn, WithoutSourceNothingCanBeRead) {
-  ErrorRecorder log;
+  LogRecorder log;
   dASCIIStreamIn stream;
   EXPECT_FALSE(stream.IsValid());
   char ch = '?';
@@ -234,7 +242,7 @@ TEST(dASCIIStreamIn, WithoutSourceNothingCanBeRead) {
 }
 
 TEST(dASCIIStreamIn, NullStringIsRefused) {
-  ErrorRecorder log;
+  LogRecorder log;
   dASCIIStreamIn stream;
   EXPECT_FALSE(stream.Init(nullptr));
   EXPECT_STREQ(stream.GetStatus(), "given string is a 'NULL' pointer");
@@ -260,7 +268,7 @@ TEST(dASCIIStreamIn, StringServesPositionedAccess) {
 }
 
 TEST(dASCIIStreamIn, StringRefusesPositionsOutside) {
-  ErrorRecorder log;
+  LogRecorder log;
   dASCIIStreamIn stream("hello");
   char out[16] = "?";
   EXPECT_FALSE(stream.GetString(2, 4, out));

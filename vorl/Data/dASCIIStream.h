@@ -60,10 +60,9 @@ class VORL_API dASCIIStreamIn : public BaseClass {
   bool GetChar(char* ch) const;
   /// Moves to a position in the file, or in the string.
   bool SetPos(unsigned long position);
-  /// Copies `length` characters from a position on and terminates them: `out` has room for `length`
-  /// +
-  /// 1. False when there are fewer, which a file then gives as far as they go; a string gives none
-  /// and sets "GetString() invalid string pos: %d(length %d)".
+  /// Copies `length` characters from a position on and terminates them: `out` has room for one more
+  /// than `length`. False when there are fewer, which a file then gives as far as they go; a string
+  /// gives none and sets "GetString() invalid string pos: %d(length %d)".
   bool GetString(unsigned long position, unsigned long length, char* out);
 
   const dStatus& GetStatus() const;
@@ -74,9 +73,8 @@ class VORL_API dASCIIStreamIn : public BaseClass {
   bool FillBuffer(unsigned long position);
   /// The same, and takes the first character; a zero character when it fails.
   bool FillBuffer(unsigned long position, char* ch);
-  /// Fails with "given file name is 'NULL' or empty", "no such file: '%s'" or "no read permission
-  /// for
-  /// '%s'".
+  /// Fails with "given file name is 'NULL' or empty", "no such file: '%s'" or
+  /// "no read permission for '%s'".
   bool CheckFile(const char* fileName);
 
  private:

@@ -33,9 +33,10 @@ enum class Amount { Small, Large };
 /// A list of the voxels of a counting volume of 8 x 8 x 8, over and over.
 inline dBuffer MakeList(std::uint32_t count) {
   dBuffer list(count * 4UL);
-  for (std::uint32_t i = 0; i < count; ++i) {
+  auto* next = static_cast<unsigned char*>(list.Get(0));
+  for (std::uint32_t i = 0; i < count; ++i, next += 4) {
     const std::uint32_t entry = voxel_lists::Pack(i % 8, i / 8 % 8, i / 64 % 8);
-    std::memcpy(list.Get(i * 4UL), &entry, 4);
+    std::memcpy(next, &entry, 4);
   }
   return list;
 }
@@ -88,7 +89,7 @@ class SliceProjectionJob : public Job {
     m_slice.GetImage().Fill(7);
     m_slice.GetCoordinates().axisY = dVect3D(0, 0.0001F, -0.0001F);
     if (drawsVolume) {
-      m_plane.GetCoordinates().axisY = dVect3D(0, large ? 0.00002F : 0.04F, 0);
+      m_plane.GetCoordinates().axisY = dVect3D(0, large ? 0.001F : 0.04F, 0);
       m_plane.GetCoordinates().axisZ = dVect3D(0, 0, 0.02F);
     }
     if (algo == SliceProjectionAlgo_VoxelList) {

@@ -58,7 +58,8 @@ TEST_P(VolumeOperatorThread, ProgressRisesFromZeroToOne) {
 
 // The row that is being worked on when the request comes is finished, and no other is begun.
 TEST_P(VolumeOperatorThread, StopsWithinOneRow) {
-  // Should the machine be so busy that the work is done before the request comes, it is tried again.
+  // Should the machine be so busy that the work is done before the request comes, it is tried
+  // again.
   for (int attempt = 0; attempt < 20; ++attempt) {
     const auto job = MakeJob(Amount::Large);
     OpBase& op = job->Op();
@@ -101,8 +102,8 @@ TEST_P(VolumeOperatorThread, EndedAtAnyMomentItsOperatorRunsAgain) {
 }
 
 TEST_P(VolumeOperatorThread, EndsWithItsOperator) {
-  for (int i = 0; i < 3; ++i) {
-    const auto job = MakeJob(Amount::Large);
+  for (int i = 0; i < 5; ++i) {
+    const auto job = MakeJob(Amount::Small);
     ASSERT_TRUE(job->Op().RunAsThread(0));
     std::this_thread::sleep_for(i * 500us);
   }

@@ -127,14 +127,25 @@ TEST(opBackProjection, RaysAcrossTheVolumeSeeItFromTheSide) {
   EXPECT_EQ(drawing.Pixels(), (Unsigned{3, 13, 103, 113}));
 }
 
-// Without a thickness the target's axes cannot be inverted, but the volume's can: the ray stays
-// where it begins.
+// A thickness of less than 1/65536 voxel: all steps of the ray are where it begins.
 TEST(opBackProjection, RaysWithoutAStepSeeTheVoxelWhereTheyBegin) {
   dVolume volume;
   MakeColumn<std::uint16_t>(volume, ImageDataType_U16, {1, 2, 3});
   Drawing<std::uint16_t> drawing(2, 1);
+  drawing.plane.GetCoordinates().axisZ = dVect3D(0, 0, 1e-5F);
+  drawing.plane.SetPosition(dVect3D(0, 0, 1.5F));
+  drawing.DrawVolume(volume);
+  EXPECT_EQ(drawing.Pixels(), (Unsigned{2, 0}));
+}
+
+// There is no way back from a plane without a thickness, and its transform becomes the identity:
+// steps of one voxel from 1.5 on, of which -1 and 0 count.
+TEST(opBackProjection, PlanesWithoutAThicknessSeeAlongTheAxesOfTheVolume) {
+  dVolume volume;
+  MakeColumn<std::uint16_t>(volume, ImageDataType_U16, {1, 2, 3});
+  Drawing<std::uint16_t> drawing(2, 1);
   drawing.plane.GetCoordinates().axisZ = dVect3D(0, 0, 0);
-  drawing.plane.SetPosition(dVect3D(0, 0, 1));
+  drawing.plane.SetPosition(dVect3D(0, 0, 2));
   drawing.DrawVolume(volume);
   EXPECT_EQ(drawing.Pixels(), (Unsigned{2, 0}));
 }
