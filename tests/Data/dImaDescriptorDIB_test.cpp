@@ -9,6 +9,11 @@
 #include <string>
 #include <vector>
 
+#include "../Support/LogRecorder.h"
+#if defined(__linux__)
+#include "../apps/FileSizeLimit.h"
+#endif
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -122,7 +127,10 @@ TEST(dImaDescriptorDIB, ColourTableIsAGreyRamp) {
   }
   descriptor.ResetPalette(false);
   for (int i = 0; i < 256; ++i) {
+    EXPECT_EQ(palette[i].rgbBlue, 255 - i);
     EXPECT_EQ(palette[i].rgbGreen, 255 - i);
+    EXPECT_EQ(palette[i].rgbRed, 255 - i);
+    EXPECT_EQ(palette[i].rgbReserved, 0);
   }
 }
 
@@ -134,6 +142,50 @@ TEST(dImaDescriptorDIB, OneBitColourTableIsBlackAndWhite) {
   descriptor.ResetPalette(false);
   EXPECT_EQ(descriptor.GetPalette()[0].rgbRed, 255);
   EXPECT_EQ(descriptor.GetPalette()[1].rgbRed, 0);
+}
+
+TEST(dImaDescriptorDIB, IsRegisteredUnderDataBase) {
+  EXPECT_STREQ(dImaDescriptorDIB::CI().name, "dImaDescriptorDIB");
+  EXPECT_EQ(dImaDescriptorDIB::CI().parents[0], &DataBase::CI());
+  EXPECT_EQ(dImaDescriptorDIB::CI().parents[1], nullptr);
+  BaseClass* object = dImaDescriptorDIB::CI().Create();
+  ASSERT_NE(object, nullptr);
+  EXPECT_STREQ(object->ClassName(), "dImaDescriptorDIB");
+  object->Release();
+}
+
+TEST(dImaDescriptorDIB, LogsWhyAnImageIsRefused) {
+  dImage image;
+  dImaDescriptorDIB descriptor;
+  LogRecorder log;
+  descriptor.Init(image);
+  EXPECT_EQ(log.errors,
+            std::vector<std::string>{"dImaDescriptorDIB::CheckImage: uninitialized image"});
+  EXPECT_EQ(log.entries,
+            (std::vector<std::string>{"dImaDescriptorDIB::Init", "dImaDescriptorDIB::CheckImage"}));
+}
+
+TEST(dImaDescriptorDIB, AssignmentHasAnInformationBlockOfItsOwn) {
+  dImage image = MakeImage(4, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB source(image);
+  dImaDescriptorDIB copy;
+  copy = source;
+  source.Reset();
+  ASSERT_TRUE(copy.IsValid());
+  EXPECT_EQ(copy.GetHeader()->bmiHeader.biHeight, -2);
+  EXPECT_EQ(copy.GetPixelData(), image.GetDataPtr());
+  EXPECT_EQ(copy.GetStatus(), 0);
+}
+
+class DescriptorOfNothing : public dImaDescriptorDIB {
+ public:
+  bool CheckNull() { return CheckImage(nullptr); }
+};
+
+TEST(dImaDescriptorDIB, NoImageIsNoBitmap) {
+  DescriptorOfNothing descriptor;
+  EXPECT_FALSE(descriptor.CheckNull());
+  EXPECT_STREQ(descriptor.GetStatus(), "uninitialized image");
 }
 
 TEST(dImaDescriptorDIB, RefusesAnImageWithoutPixels) {
@@ -267,6 +319,23 @@ TEST_F(dImaDescriptorDIBFile, SavesAOneBitImage) {
   EXPECT_EQ(U32At(bytes, 18), 10U);
   EXPECT_EQ(U32At(bytes, 54), 0U);
   EXPECT_EQ(U32At(bytes, 58), 0x00FFFFFFU);
+  EXPECT_EQ(std::memcmp(&bytes[62], image.GetRowPtr(1), 4), 0);
+  EXPECT_EQ(std::memcmp(&bytes[66], image.GetRowPtr(0), 4), 0);
+}
+
+TEST_F(dImaDescriptorDIBFile, SavesAThirtyTwoBitImage) {
+  dImage image = MakeImage(3, 2, ImageDataType_U8, "BGRA");
+  dImaDescriptorDIB descriptor(image);
+  ASSERT_TRUE(descriptor.Save(m_path.c_str(), false));
+  const auto bytes = FileBytes();
+  ASSERT_EQ(bytes.size(), 54U + 24U);
+  EXPECT_EQ(U16At(bytes, 26), 1U);   // planes
+  EXPECT_EQ(U16At(bytes, 28), 32U);  // bits
+  EXPECT_EQ(U32At(bytes, 30), 0U);   // uncompressed
+  EXPECT_EQ(U32At(bytes, 38), 0U);   // no resolution
+  EXPECT_EQ(U32At(bytes, 42), 0U);
+  EXPECT_EQ(std::memcmp(&bytes[54], image.GetRowPtr(1), 12), 0);
+  EXPECT_EQ(std::memcmp(&bytes[66], image.GetRowPtr(0), 12), 0);
 }
 
 TEST_F(dImaDescriptorDIBFile, ExistingFileStaysWithoutOverwrite) {
@@ -308,8 +377,17 @@ TEST_F(dImaDescriptorDIBFile, PathMustBeGiven) {
   dImaDescriptorDIB descriptor(image);
   EXPECT_FALSE(descriptor.Save(nullptr, true));
   EXPECT_STREQ(descriptor.GetStatus(), "NULL parameter:'FilePath'");
+  LogRecorder log;
   EXPECT_FALSE(descriptor.Save("", true));
   EXPECT_STREQ(descriptor.GetStatus(), "NULL parameter:'FilePath'");
+  EXPECT_EQ(log.errors,
+            std::vector<std::string>{"dImaDescriptorDIB::Save: NULL parameter:'FilePath'"});
+}
+
+TEST_F(dImaDescriptorDIBFile, MissingImageIsToldBeforeAMissingPath) {
+  dImaDescriptorDIB descriptor;
+  EXPECT_FALSE(descriptor.Save(nullptr, true));
+  EXPECT_STREQ(descriptor.GetStatus(), "dImaDescriptorDIB: not initialized");
 }
 
 TEST_F(dImaDescriptorDIBFile, WithoutAnImageNothingIsSaved) {
@@ -336,6 +414,26 @@ TEST_F(dImaDescriptorDIBFile, BlockThatLiesAboutTheImageIsNotSaved) {
 }
 
 #if defined(__linux__)
+TEST_F(dImaDescriptorDIBFile, DiskThatFillsUpIsToldByThePartThatIsCutOff) {
+  const struct {
+    unsigned long bytes;
+    const char* part;
+  } kLimits[] = {{0, "file header"}, {20, "bitmap info"}, {1080, "pixel data"}};
+  dImage image = MakeImage(4, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  for (const auto& limit : kLimits) {
+    bool saved = true;
+    {
+      const study_test::FileSizeLimit full(limit.bytes);
+      saved = descriptor.Save(m_path.c_str(), true);
+    }
+    EXPECT_FALSE(saved) << limit.part;
+    EXPECT_EQ(std::string(static_cast<const char*>(descriptor.GetStatus())),
+              std::string("error while writing ") + limit.part + " to '" + m_path + "'");
+    EXPECT_FALSE(fs::exists(m_path)) << limit.part;
+  }
+}
+
 TEST_F(dImaDescriptorDIBFile, FullDiskIsAFailureAndTheDeviceStays) {
   dImage image = MakeImage(4, 2, ImageDataType_U8, "G");
   dImaDescriptorDIB descriptor(image);

@@ -1,3 +1,4 @@
+#include "Sha256.h"
 #include "TestFolder.h"
 #include "TestStudies.h"
 
@@ -20,6 +21,7 @@ struct TableLine {
   double z;
   int smallest;
   int largest;
+  std::string sum;  ///< the first half of the check sum of the samples, as 32-bit numbers
 };
 
 std::vector<TableLine> ReadTable() {
@@ -34,12 +36,26 @@ std::vector<TableLine> ReadTable() {
       cells.push_back(cell);
     }
     if (cells.size() == 10 && cells[0] == "ct-a") {
-      lines.push_back({std::stod(cells[6]), std::stoi(cells[7]), std::stoi(cells[8])});
+      lines.push_back({std::stod(cells[6]), std::stoi(cells[7]), std::stoi(cells[8]), cells[9]});
     }
   }
   std::sort(lines.begin(), lines.end(),
             [](const TableLine& a, const TableLine& b) { return a.z < b.z; });
   return lines;
+}
+
+/// The samples as little-endian 32-bit numbers.
+std::string Widened(std::span<const std::uint16_t> samples) {
+  std::string bytes;
+  for (const std::uint16_t sample : samples) {
+    bytes += {static_cast<char>(sample & 0xFF), static_cast<char>(sample >> 8), '\0', '\0'};
+  }
+  return bytes;
+}
+
+TEST(RealSeries, CheckSumIsTheStandardOne) {
+  EXPECT_EQ(Sha256("abc"), "ba7816bf8f01cfea414140de5dae2223b00361a396177a9cb410ff61f20015ad");
+  EXPECT_EQ(Sha256(std::string(56, 'a')).substr(0, 16), "b35439a4ac6f0948");
 }
 
 TEST(RealSeries, MatchesItsTable) {
@@ -63,6 +79,7 @@ TEST(RealSeries, MatchesItsTable) {
     const auto [smallest, largest] = std::minmax_element(samples.begin(), samples.end());
     EXPECT_EQ(*smallest, line.smallest) << k;
     EXPECT_EQ(*largest, line.largest) << k;
+    EXPECT_EQ(Sha256(Widened(samples)).substr(0, 16), line.sum) << k;
     EXPECT_NEAR(WorldFromVoxel(*study, {0.5, 0.5, k + 0.5}).z, line.z, 1e-3) << k;
   }
 }

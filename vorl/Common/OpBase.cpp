@@ -1,5 +1,7 @@
 #include <vorl/Common/OpBase.h>
 
+#include <new>
+
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Common/detail/OperatorThread.h>
 
@@ -47,9 +49,12 @@ bool OpBase::Reset() {
 
 bool OpBase::Run() {
   Start();
-  bool ok = Prepare();
-  if (ok) {
-    ok = Process();
+  bool ok = false;
+  try {
+    ok = Prepare() && Process();
+  } catch (const std::bad_alloc&) {
+    ok = false;
+    m_status.Set(false, "out of memory");
   }
   return Exit(ok);
 }

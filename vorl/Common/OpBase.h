@@ -42,6 +42,7 @@ class VORL_API OpBase : public BaseClass {
   /// Drops inputs and results; returns true.
   virtual bool Reset();
   /// `Start`, `Prepare`, `Process` only if that succeeded, and `Exit`, whose result is returned.
+  /// When the two find no memory the run fails with "out of memory".
   virtual bool Run();
   /// Asks the operator's own thread to end early, within one output row of a picture. Without a
   /// running thread it only clears the request.

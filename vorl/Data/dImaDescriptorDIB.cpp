@@ -20,6 +20,8 @@ constexpr std::uint32_t kInfoHeaderSize = sizeof(tagBITMAPINFOHEADER);
 constexpr std::uint32_t kFileHeaderSize = sizeof(tagBITMAPFILEHEADER);
 constexpr WORD kBitmapFileType = 19778;  // the characters "BM"
 
+constexpr char kConversionPrefix[] = "unable to convert into 'Bitmap':\n\t";
+
 unsigned PaletteEntries(unsigned bitsPerPixel) {
   return bitsPerPixel < 9 ? 1U << bitsPerPixel : 0;
 }
@@ -62,8 +64,29 @@ dImaDescriptorDIB::dImaDescriptorDIB(dImage& image) {
   Init(image);
 }
 
-dImaDescriptorDIB::dImaDescriptorDIB(const dImaDescriptorDIB& source) = default;
-dImaDescriptorDIB& dImaDescriptorDIB::operator=(const dImaDescriptorDIB& source) = default;
+dImaDescriptorDIB::dImaDescriptorDIB(const dImaDescriptorDIB& source) : DataBase(source) {
+  dImaDescriptorDIB::operator=(source);
+}
+
+dImaDescriptorDIB& dImaDescriptorDIB::operator=(const dImaDescriptorDIB& source) {
+  if (this == &source) {
+    return *this;
+  }
+  try {
+    m_block = source.m_block;
+  } catch (const std::bad_alloc&) {
+    Reset();
+    m_status.Set(false, "%s no memory for 'BITMAPINFO' structure", kConversionPrefix);
+    return *this;
+  }
+  m_status = source.m_status;
+  m_pImage = source.m_pImage;
+  m_pixelData = source.m_pixelData;
+  m_imageWidth = source.m_imageWidth;
+  m_headerSize = source.m_headerSize;
+  return *this;
+}
+
 dImaDescriptorDIB::~dImaDescriptorDIB() = default;
 
 void dImaDescriptorDIB::Reset() {
@@ -114,8 +137,7 @@ tagBITMAPINFO* dImaDescriptorDIB::Init(dImage& image) {
   try {
     m_block.assign((headerSize + sizeof(tagBITMAPINFO) - 1) / sizeof(tagBITMAPINFO), {});
   } catch (const std::bad_alloc&) {
-    m_status.Set(false, "%s no memory for 'BITMAPINFO' structure",
-                 "unable to convert into 'Bitmap':\n\t");
+    m_status.Set(false, "%s no memory for 'BITMAPINFO' structure", kConversionPrefix);
     context.Status(__LINE__, m_status);
     return nullptr;
   }
@@ -251,11 +273,11 @@ bool dImaDescriptorDIB::WriteFileHeader(vorl_detail::BitmapFile& file) const {
 
 // In the file the bitmap has the image's real width and its bottom row first.
 bool dImaDescriptorDIB::WriteInfo(vorl_detail::BitmapFile& file) const {
-  std::vector<tagBITMAPINFO> block = m_block;
-  BITMAPINFOHEADER& header = block.front().bmiHeader;
+  BITMAPINFOHEADER header = m_block.front().bmiHeader;
   header.biWidth = static_cast<LONG>(m_imageWidth);
   header.biHeight = static_cast<LONG>(RowCount());
-  return file.Write(block.data(), m_headerSize);
+  return file.Write(&header, kInfoHeaderSize) &&
+         file.Write(GetPalette(), GetPaletteSize() * sizeof(RGBQUAD));
 }
 
 bool dImaDescriptorDIB::WriteRows(vorl_detail::BitmapFile& file) const {

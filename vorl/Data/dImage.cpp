@@ -1,6 +1,7 @@
 #include <vorl/Data/dImage.h>
 
 #include <cstring>
+#include <new>
 
 #include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
@@ -11,6 +12,20 @@ inline namespace vorl {
 using vorl_detail::ImageFormat;
 using vorl_detail::ImageFormatError;
 using vorl_detail::ImageLayout;
+
+namespace {
+
+// False when there is no memory for the copy. A null text is taken as empty.
+bool CopyText(const char* text, std::string& copy) {
+  try {
+    copy.assign(text != nullptr ? text : "");
+    return true;
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+}
+
+}  // namespace
 
 VORL_REGISTER_CLASS(dImage, DataBase);
 
@@ -62,7 +77,12 @@ bool dImage::Init(unsigned long width, unsigned long height, unsigned short data
                   unsigned short rowAlignment) {
   LogContext context("dImage::Init", __FILE__, __LINE__, true);
   // Copied: the sequence may be this image's own, which a reset clears.
-  const std::string sequence = channelSequence != nullptr ? channelSequence : "";
+  std::string sequence;
+  if (!CopyText(channelSequence, sequence)) {
+    Reset();
+    m_status.Set(false, "no memory(%zu bytes required)", std::strlen(channelSequence));
+    return Fail(context, __LINE__);
+  }
   ImageFormat format{width,     height,      dataType, ScanNumberOfChannels(sequence.c_str()),
                      dataOrder, rowAlignment};
   switch (vorl_detail::CheckImageFormat(format)) {
@@ -99,7 +119,7 @@ bool dImage::Init(unsigned long width, unsigned long height, unsigned short data
     }
   }
   SetLayout(layout);
-  m_channelSequence = sequence;
+  m_channelSequence.swap(sequence);
   m_status = true;
   OnInit();
   return m_status.IsOK();
@@ -128,8 +148,15 @@ bool dImage::Init(const dImage& model, unsigned long width, unsigned long height
 }
 
 // Resets this image and gives it the format of `source`. The pixels stay for the transfer that
-// follows: the source may refer to them, and the buffer knows how to part from them then.
-void dImage::ResetTo(const dImage& source) {
+// follows: the source may refer to them, and the buffer knows how to part from them then. False,
+// with the image reset, when there is no memory for the names of the channels.
+bool dImage::ResetTo(const dImage& source) {
+  std::string sequence;
+  if (!CopyText(source.GetChannelSequence(), sequence)) {
+    Reset();
+    m_status.Set(false, "no memory(%zu bytes required)", source.m_channelSequence.size());
+    return false;
+  }
   dBuffer pixels;
   pixels <<= m_buffer;
   Reset();
@@ -141,11 +168,12 @@ void dImage::ResetTo(const dImage& source) {
   m_rowAlignment = source.m_rowAlignment;
   m_pixelBits = source.m_pixelBits;
   m_channelOffset = source.m_channelOffset;
-  m_channelSequence = source.m_channelSequence;
+  m_channelSequence.swap(sequence);
   m_columnOffset = source.m_columnOffset;
   m_rowOffset = source.m_rowOffset;
   m_channelOffsetBytes = source.m_channelOffsetBytes;
   m_status = source.m_status;
+  return true;
 }
 
 bool dImage::Init(DataTransferMode mode, dImage& source) {
@@ -153,7 +181,9 @@ bool dImage::Init(DataTransferMode mode, dImage& source) {
   if (this == &source) {
     return IsValid();
   }
-  ResetTo(source);
+  if (!ResetTo(source)) {
+    return Fail(context, __LINE__);
+  }
   m_buffer.Init(source.m_buffer, mode);
   if (mode == DTM_Copy && source.IsValid() && !IsValid()) {
     Reset();
@@ -188,7 +218,9 @@ void dImage::operator<<=(dImage& source) {
   if (this == &source) {
     return;
   }
-  ResetTo(source);
+  if (!ResetTo(source)) {
+    return;
+  }
   m_buffer.Init(source.m_buffer, DTM_TakeOver);
   OnInit();
   source.Reset();

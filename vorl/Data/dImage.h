@@ -134,7 +134,8 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// image. Pixels of the same byte size are overwritten in place, which for an image that refers
   /// to pixels means those it refers to. `source` may refer to this image's pixels.
   dImage& operator=(const dImage& source);
-  /// Moves `source` into this image; the source is reset.
+  /// Moves `source` into this image; the source is reset. When there is no memory for the names of
+  /// the channels, the source stays and this image is reset.
   void operator<<=(dImage& source);
   /// Moves this image into `destination`; this image is reset.
   void operator>>=(dImage& destination);
@@ -235,7 +236,7 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   dBuffer m_buffer;
 
  private:
-  void ResetTo(const dImage& source);
+  bool ResetTo(const dImage& source);
   void SetLayout(const vorl_detail::ImageLayout& layout);
   void ReadItems(BinaryDataIn& in);
   bool Fail(LogContext& context, int line);

@@ -3,11 +3,31 @@
 #include <algorithm>
 #include <iterator>
 #include <mutex>
+#include <new>
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Data/detail/Placement.h>
 
 inline namespace vorl {
+
+namespace {
+
+// False when there is no memory for the slices or for the pixels of one.
+bool CopySlices(const std::list<dSlice>& source, std::list<dSlice>& copy) {
+  try {
+    for (const dSlice& slice : source) {
+      copy.push_back(slice);
+      if (copy.back().GetImage().IsValid() != slice.GetImage().IsValid()) {
+        return false;
+      }
+    }
+    return true;
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+}
+
+}  // namespace
 
 VORL_REGISTER_CLASS(dVolume, DataBase);
 
@@ -15,17 +35,19 @@ dVolume::dVolume() {
   dVolume::Reset();
 }
 
-dVolume::dVolume(const dVolume& source)
-    : DataBase(source),
-      m_sliceList(source.m_sliceList),
-      m_sliceDataArray(source.m_sliceDataArray),
-      m_coordinates(source.m_coordinates) {}
+dVolume::dVolume(const dVolume& source) : DataBase(source) {
+  dVolume::operator=(source);
+}
 
 dVolume& dVolume::operator=(const dVolume& source) {
   if (this != &source) {
     // New slices, and the old ones freed only afterwards: slices may refer to pixels elsewhere,
     // which are not to be overwritten, and those of the source to pixels of this volume.
-    std::list<dSlice> slices(source.m_sliceList);
+    std::list<dSlice> slices;
+    if (!CopySlices(source.m_sliceList, slices)) {
+      Reset();
+      return *this;
+    }
     m_sliceList.swap(slices);
     m_sliceDataArray = source.m_sliceDataArray;
     m_coordinates = source.m_coordinates;
@@ -107,7 +129,12 @@ int dVolume::AddSlice(dSlice& slice) {
   if (!Accepts(slice)) {
     return -1;
   }
-  dSlice& added = m_sliceList.emplace_back();
+  try {
+    m_sliceList.emplace_back();
+  } catch (const std::bad_alloc&) {
+    return -1;
+  }
+  dSlice& added = m_sliceList.back();
   added.SetCoordinates(slice.GetCoordinates());
   added.GetImage() <<= slice.GetImage();
   return GetSliceCount() - 1;

@@ -22,6 +22,7 @@ class VORL_API dVolume : public DataBase {
   /// Copies slices and coordinates. The cached slice data array is taken over as it stands: it
   /// shows the source's slices until the number of slices changes.
   dVolume(const dVolume& source);
+  /// As above. When there is no memory for all slices, this volume is left reset.
   dVolume& operator=(const dVolume& source);
 
   ClassInfo* GetClassInfo() override;
@@ -52,7 +53,8 @@ class VORL_API dVolume : public DataBase {
   const std::list<dSlice>& GetSliceList() const;
   /// Appends a slice that takes over the coordinates and the pixels of `slice`, whose image is left
   /// reset. Returns the new slice's index, or -1, without any change, when `slice` differs from the
-  /// first one in width, height or pixel format, or already is a slice of this volume.
+  /// first one in width, height or pixel format, already is a slice of this volume, or finds no
+  /// memory.
   int AddSlice(dSlice& slice);
 
   /// The pixel data pointers of the slices, in order; null when there are none. Entry -1 repeats

@@ -268,4 +268,59 @@ TEST(opLookup, SixteenBitsGiveAnImageOfTheTablesType) {
   EXPECT_EQ(SamplesOf<std::uint8_t>(target), (Samples8{200}));
 }
 
+TEST(opLookup, RefusesATableWhoseEntriesWereExchanged) {
+  dImage source;
+  MakeOf<std::uint8_t>(source, {4, 1, ImageDataType_U8}, {0, 1, 254, 255});
+  CountingLUT lut(256, 0);
+  std::uint8_t few[10] = {};
+  static_cast<dImage&>(lut).GetDataBuffer().Init(few, sizeof few, DTM_Reference);
+  EXPECT_EQ(MessageFor(&source, &lut), "invalid entries in the LUT");
+}
+
+/// A table that claims entries of a type that no image has.
+class StrangeLUT : public dLUT {
+ public:
+  StrangeLUT() {
+    Init(256, LUTType_U8, 1, 0);
+    m_type = static_cast<LUTType>(0x4008);
+  }
+};
+
+TEST(opLookup, SixteenBitSourceStaysWhenTheResultCannotBeMade) {
+  dImage source;
+  MakeOf<std::uint16_t>(source, {2, 1, ImageDataType_U16}, {3, 70});
+  const auto before = BytesOf(source);
+  StrangeLUT lut;
+  EXPECT_EQ(MessageFor(&source, &lut),
+            "error while creating image buffer:invalid 'DataType': 16392");
+  opLookup inPlace(&source, nullptr, &lut);
+  EXPECT_EQ(CodeOf(inPlace), -1);
+  EXPECT_EQ(BytesOf(source), before);
+}
+
+class LookupSteps : public opLookup {
+ public:
+  using opLookup::Prepare;
+  using opLookup::Process;
+};
+
+TEST(opLookup, ProcessesOnlyWhatWasPrepared) {
+  dImage source;
+  MakeOf<std::uint8_t>(source, {2, 1, ImageDataType_U8}, {3, 70});
+  CountingLUT lut(256, 0, 1);
+  LookupSteps op;
+  EXPECT_FALSE(op.Process());
+  op.m_pSource = &source;
+  op.m_pLUT = &lut;
+  EXPECT_TRUE(op.Prepare());
+  EXPECT_TRUE(op.Process());
+  op.m_pLUT = nullptr;
+  EXPECT_FALSE(op.Prepare());
+  EXPECT_FALSE(op.Process());
+  op.m_pLUT = &lut;
+  EXPECT_TRUE(op.Prepare());
+  op.Reset();
+  EXPECT_FALSE(op.Process());
+}
+
 }  // namespace

@@ -5,6 +5,8 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <cstdint>
+#include <vector>
 
 #include "Volumes.h"
 
@@ -240,6 +242,42 @@ TEST(opMPR, StoppedBeforeItsPreparationSaysSo) {
   op.volume = &bench.volume;
   op.mprSlice = &bench.slice;
   ExpectFailure(op, "stopped");
+}
+
+/// The samples of row 0 of a 1 x 1 x 1 step walk through a volume of `width` x 1 x 1 voxels,
+/// each 7.
+std::vector<std::uint16_t> RowThrough(unsigned long width, float firstX, unsigned long count) {
+  dVolume volume;
+  dSlice added;
+  EXPECT_TRUE(added.GetImage().Init(width, 1, ImageDataType_U16, "G", 0, 2));
+  added.GetImage().GetDataBuffer().Set(static_cast<unsigned short>(7));
+  EXPECT_EQ(volume.AddSlice(added), 0);
+  dSlice slice;
+  EXPECT_TRUE(slice.GetImage().Init(count, 1, ImageDataType_U16, "G", 0, 2));
+  slice.SetPosition(dVect3D(firstX, 0, 0));
+  opMPR op;
+  op.volume = &volume;
+  op.mprSlice = &slice;
+  EXPECT_TRUE(op.Run());
+  const auto* samples = static_cast<const std::uint16_t*>(slice.GetImage().GetDataPtr());
+  return {samples, samples + count};
+}
+
+TEST(opMPR, VolumesOf32768VoxelsAndMoreWrapTheirLimits) {
+  EXPECT_EQ(RowThrough(32767, 32765, 3), (std::vector<std::uint16_t>{7, 7, 0}));
+  EXPECT_EQ(RowThrough(32768, 0, 3), (std::vector<std::uint16_t>{0, 0, 0}));
+  EXPECT_EQ(RowThrough(65536 + 5, 3, 4), (std::vector<std::uint16_t>{7, 7, 0, 0}));
+}
+
+TEST(opMPR, VolumeAndSliceWithoutPixelsHaveNoSupportedType) {
+  dVolume volume;
+  dSlice empty;
+  ASSERT_EQ(volume.AddSlice(empty), 0);
+  dSlice slice;
+  opMPR op;
+  op.volume = &volume;
+  op.mprSlice = &slice;
+  ExpectFailure(op, "unsupported data type: 0");
 }
 
 }  // namespace

@@ -44,19 +44,19 @@ void ExpectSame(const study::Study& a, const study::Study& b) {
 TEST(Convert, KeepsTheStudyBitForBit) {
   const TestFolder folder;
   const std::string path = (folder / "a.bdf").string();
-  const Outcome outcome = RunTool({"convert", "--phantom=20x16x12", path});
+  const Outcome outcome = RunTool({"convert", "--phantom=40x32x10", path});
   EXPECT_EQ(outcome.code, 0);
   EXPECT_EQ(outcome.output, "");
   EXPECT_EQ(outcome.errors, "");
   EXPECT_EQ(folder.Names(), Names{"a.bdf"});
-  ExpectSame(*study::ReadStudyFile(path), *study::MakePhantom(20, 16, 12));
+  ExpectSame(*study::ReadStudyFile(path), *study::MakePhantom(40, 32, 10));
 }
 
 TEST(Convert, AStudyFileConvertedIsTheSameFile) {
   const TestFolder folder;
   const std::string first = (folder / "a.bdf").string();
   const std::string second = (folder / "b.BDF").string();
-  ASSERT_EQ(RunTool({"phantom", "--size", "20x16x12", first}).code, 0);
+  ASSERT_EQ(RunTool({"phantom", "--size", "40x32x10", first}).code, 0);
   ASSERT_EQ(RunTool({"convert", first, second}).code, 0);
   EXPECT_EQ(ReadBytes(second), ReadBytes(first));
   ASSERT_EQ(RunTool({"convert", first, first}).code, 0) << "onto itself";
@@ -85,7 +85,7 @@ class PhantomEncoding : public testing::TestWithParam<const char*> {};
 TEST_P(PhantomEncoding, ASeriesBroughtBackHoldsTheSameValues) {
   const TestFolder folder;
   const std::string series = (folder / "series").string();
-  Arguments arguments{"phantom", series, "--size", "20x16x12"};
+  Arguments arguments{"phantom", series, "--size", "40x32x10"};
   if (*GetParam() != '\0') {
     arguments.insert(arguments.end(), {"--encoding", GetParam()});
   }
@@ -94,7 +94,7 @@ TEST_P(PhantomEncoding, ASeriesBroughtBackHoldsTheSameValues) {
   const Outcome converted = RunTool({"convert", series, (folder / "a.bdf").string()});
   EXPECT_EQ(converted.code, 0);
   EXPECT_EQ(converted.errors, "");
-  ExpectSame(*study::ReadStudyFile(folder / "a.bdf"), *study::MakePhantom(20, 16, 12));
+  ExpectSame(*study::ReadStudyFile(folder / "a.bdf"), *study::MakePhantom(40, 32, 10));
 }
 
 INSTANTIATE_TEST_SUITE_P(All, PhantomEncoding,

@@ -43,7 +43,7 @@ TEST_F(OutputFailure, AFullDeviceBehindALinkIsAnErrorForBothKindsOfPicture) {
 
 TEST_F(OutputFailure, AFullDiskLeavesNoFileAndKeepsTheEarlierOne) {
   Conditions full;
-  full.largestFile = 1500;
+  full.largestFile = 500;
   for (const auto& [name, command] :
        {std::pair<const char*, Arguments>{"a.png", {"mpr", kPhantom, "-o"}},
         std::pair<const char*, Arguments>{"a.bmp", {"mpr", kPhantom, "-o"}},
@@ -71,7 +71,7 @@ TEST_F(OutputFailure, AFullDiskLeavesNoFileAndKeepsTheEarlierOne) {
 
 TEST_F(OutputFailure, AFullDiskLeavesNoSeriesBehind) {
   Conditions full;
-  full.largestFile = 1500;
+  full.largestFile = 500;
   const Outcome outcome = RunTool({"phantom", "--size", "64x64x4", PathOf("series")}, full);
   EXPECT_EQ(outcome.code, 1);
   EXPECT_EQ(outcome.errors.substr(0, 19), "vorl: can't write '");

@@ -1,4 +1,5 @@
 #include "CutFixture.h"
+#include "GreyModel.h"
 
 #include <study/StudyFile.h>
 
@@ -34,8 +35,8 @@ TEST_F(MprPictures, CoronalShowsTheHeadUpAndThePatientsLeftOnTheRight) {
   const Picture picture = CutPicture({kPhantom, "--plane", "coronal", "--window", "soft"});
   ASSERT_EQ(picture.width, 100);
   ASSERT_EQ(picture.height, 80);
-  EXPECT_LT(picture.Mean(30, 15, 36, 25), 10);   // the right lung, 70 mm above the centre
-  EXPECT_LT(picture.Mean(64, 15, 70, 25), 10);   // the left one
+  EXPECT_LT(picture.Mean(30, 15, 36, 25), 40);   // the right lung, 70 mm above the centre
+  EXPECT_LT(picture.Mean(64, 15, 70, 25), 40);   // the left one
   EXPECT_GT(picture.Mean(30, 50, 40, 60), 130);  // the liver, 60 mm below it, on the right
 }
 
@@ -89,15 +90,9 @@ TEST_F(MprPictures, PictureAndSliceComeFromOneRun) {
   const auto slice = study::ReadStudyFile(PathOf("a.bdf"));
   const std::vector<std::uint16_t> samples = cli_test::SamplesOf(*slice);
   ASSERT_EQ(samples.size(), picture.levels.size());
+  const std::vector<int> levels = cli_test::WindowLevels(40 + 1024, 400, 65536);
   for (std::size_t i = 0; i < samples.size(); ++i) {
-    const double value = samples[i] - 1024.0;
-    if (value < -160) {
-      ASSERT_EQ(picture.levels[i], 0) << value;
-    } else if (value >= 240) {
-      ASSERT_EQ(picture.levels[i], 255) << value;
-    } else {
-      ASSERT_EQ(picture.levels[i], static_cast<int>(0.5 + (value + 160) * 255 / 400)) << value;
-    }
+    ASSERT_EQ(picture.levels[i], levels[samples[i]]) << samples[i];
   }
 }
 

@@ -46,10 +46,10 @@ TEST_F(MprSampling, NearestIsTheUsualFilter) {
 }
 
 TEST_F(MprSampling, StepsAreTheSamplesAcrossTheSlab) {
-  m_plane.thickness = 11;
+  m_plane.thickness = 11.3;
   for (const int steps : {2, 3, 8, 50}) {
     m_plane.steps = steps;
-    ExpectCut(*CutSlice(PlaneArguments({"--thickness", "11", "--steps", std::to_string(steps)})),
+    ExpectCut(*CutSlice(PlaneArguments({"--thickness", "11.3", "--steps", std::to_string(steps)})),
               m_volume, m_plane, 0.1);
   }
 }
@@ -102,7 +102,7 @@ TEST_F(MprSampling, LinearAndNearestShowAThingAtTheSamePlace) {
     }
     return moment / sum;
   };
-  const double expected = 79.5 + (23 - 24) / 0.25 * -1;  // z = 24
+  const double expected = 79.5 - (24 - 23) / 0.25;  // z = 24 is above the centre
   EXPECT_NEAR(middleOf("nearest"), expected, 0.51);
   EXPECT_NEAR(middleOf("linear"), expected, 0.51);
 }

@@ -1,10 +1,8 @@
 #include "CutFixture.h"
+#include "GreyModel.h"
 
 #include <study/StudyFile.h>
 
-#include <algorithm>
-#include <cmath>
-#include <numeric>
 #include <string>
 
 namespace {
@@ -14,44 +12,6 @@ using cli_test::CutFixture;
 using cli_test::Picture;
 using cli_test::Point;
 using cli_test::VolumeModel;
-
-/// The grey level of a stored value: black below centre - width / 2, rising to white within the
-/// width, white from there on.
-int Level(double stored, double centre, double width) {
-  const double low = centre - std::floor(width / 2);
-  if (stored < low) {
-    return 0;
-  }
-  return stored >= low + width ? 255 : static_cast<int>(0.5 + (stored - low) * 255 / width);
-}
-
-/// The brightness, contrast and gamma table by its definition.
-std::vector<int> SecondStage(double brightness, double contrast, double gamma) {
-  const double angle = (contrast + 1.0) * 45.0 / 180.0 * 3.141592;
-  const double slope = std::sin(angle) / std::max(std::cos(angle), 0.001);
-  double value = 256.0 - (slope + 1.0) * (1.0 - brightness) * 128.0;
-  std::vector<int> table;
-  double low = 255;
-  double high = 0;
-  std::size_t first = 0;
-  std::size_t last = 0;
-  for (std::size_t i = 0; i < 256; ++i, value += slope) {
-    table.push_back(value < 0 ? 0 : value >= 256 ? 255 : static_cast<int>(value));
-    if (value >= 0 && value < 256 && value < low) {
-      low = value;
-      first = i;
-    }
-    if (value >= 0 && value < 256 && value > high) {
-      high = value;
-      last = i;
-    }
-  }
-  for (std::size_t i = first; gamma != 1 && i < last; ++i) {
-    const double part = std::max(0.0, (table[i] - low) / (high - low));
-    table[i] = static_cast<int>(std::pow(part, 1 / gamma) * (high - low) + low);
-  }
-  return table;
-}
 
 /// A volume of one slice of 64 x 64 voxels: the stored values are 0, 1, 2 ... or multiples.
 class MprWindow : public CutFixture {
@@ -77,10 +37,11 @@ class MprWindow : public CutFixture {
   }
 
   /// What a window in real values must show of the ramp.
-  static std::vector<int> ExpectedLevels(double centre, double width, int factor) {
+  static std::vector<int> ExpectedLevels(long centre, long width, int factor) {
+    const std::vector<int> table = cli_test::WindowLevels(centre - kOffset, width, 65536);
     std::vector<int> levels;
     for (int n = 0; n < kSide * kSide; ++n) {
-      levels.push_back(Level(n * factor, centre - kOffset, width));
+      levels.push_back(table[static_cast<std::size_t>(n * factor)]);
     }
     return levels;
   }
@@ -163,15 +124,16 @@ TEST_F(MprWindow, AnInputsOwnWindowIsTheUsualOne) {
 
 TEST_F(MprWindow, BrightnessContrastAndGammaBendTheLevelsInsideTheWindow) {
   WriteRamp(1);
+  const std::vector<int> levels = cli_test::WindowLevels(2000, 3000, kSide * kSide);
   struct Case {
     double brightness, contrast, gamma;
   };
   for (const Case& one : {Case{0.3, 0, 1}, Case{-0.3, 0, 1}, Case{0, 0.4, 1}, Case{0, -0.4, 1},
                           Case{0, 0, 2.2}, Case{0, 0, 0.5}, Case{0.1, 0.2, 1.5}}) {
-    const std::vector<int> stage = SecondStage(one.brightness, one.contrast, one.gamma);
+    const std::vector<int> stage = cli_test::SecondStage(one.brightness, one.contrast, one.gamma);
     std::vector<int> expected;
     for (int n = 0; n < kSide * kSide; ++n) {
-      const int level = Level(n, 2000, 3000);
+      const int level = levels[static_cast<std::size_t>(n)];
       expected.push_back(n >= 500 && n < 3500 ? stage[static_cast<std::size_t>(level)] : level);
     }
     EXPECT_EQ(LevelsWith({"--window", "1000,3000", "--brightness", std::to_string(one.brightness),

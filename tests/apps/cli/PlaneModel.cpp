@@ -6,7 +6,10 @@
 namespace cli_test {
 namespace {
 
-constexpr double kBorder = 1e-3;
+/// How far from a voxel's border a point must lie to be decided.
+double BorderOf(const PlaneModel& plane) {
+  return 1e-3 + (plane.width + plane.height + plane.steps) / 65536.0;
+}
 
 double Dot(const Point& a, const Point& b) {
   return a[0] * b[0] + a[1] * b[1] + a[2] * b[2];
@@ -41,11 +44,12 @@ Point VoxelAt(const VolumeModel& volume, const Point& world) {
 
 enum class Place { Inside, Outside, Border };
 
-Place Locate(const VolumeModel& volume, const Point& voxel, std::array<int, 3>& index) {
+Place Locate(const VolumeModel& volume, const Point& voxel, double border,
+             std::array<int, 3>& index) {
   Place place = Place::Inside;
   for (std::size_t n = 0; n < 3; ++n) {
     const double cell = voxel[n] + 0.5;
-    if (std::abs(cell - std::round(cell)) < kBorder) {
+    if (std::abs(cell - std::round(cell)) < border) {
       return Place::Border;
     }
     index[n] = static_cast<int>(std::floor(cell));
@@ -65,7 +69,8 @@ std::optional<int> SampleAt(const VolumeModel& volume, const PlaneModel& plane,
     const double depth =
         plane.steps > 1 ? plane.thickness * (-0.5 + static_cast<double>(k) / (plane.steps - 1)) : 0;
     std::array<int, 3> index{};
-    const Place place = Locate(volume, VoxelAt(volume, Plus(point, depth, normal)), index);
+    const Place place =
+        Locate(volume, VoxelAt(volume, Plus(point, depth, normal)), BorderOf(plane), index);
     if (place == Place::Border) {
       return std::nullopt;
     }

@@ -44,7 +44,8 @@ PlaneModel SagittalPlane();
 
 /// The samples row by row: of the voxels around the points, or, with steps, their mean (a whole
 /// number, cut off) over the points inside; 0 where there is none. A pixel one of whose points lies
-/// within a thousandth of a voxel's border is empty: rounding decides there.
+/// close to a voxel's border is empty: there, rounding decides. (Steps are kept to 1/65536 of a
+/// voxel, which adds up from pixel to pixel.)
 std::vector<std::optional<int>> NearestSamples(const VolumeModel& volume, const PlaneModel& plane);
 
 /// How `actual` compares with `expected`.

@@ -1,6 +1,7 @@
 #include <vorl/Data/detail/BitmapFile.h>
 
 #include <filesystem>
+#include <new>
 #include <system_error>
 #include <utility>
 
@@ -35,7 +36,14 @@ bool MakeRoomForFile(const char* path) {
   return fs::is_regular_file(path, error) && fs::remove(path, error);
 }
 
-BitmapFile::BitmapFile(const char* path) : m_path(path), m_file(OpenForWriting(path)) {}
+BitmapFile::BitmapFile(const char* path) : m_file(nullptr) {
+  try {
+    m_path = path;
+    m_file = OpenForWriting(path);
+  } catch (const std::bad_alloc&) {
+    m_file = nullptr;  // a file whose name is not known could not be removed again
+  }
+}
 
 BitmapFile::~BitmapFile() {
   if (m_file != nullptr) {
@@ -48,7 +56,7 @@ BitmapFile::~BitmapFile() {
 }
 
 bool BitmapFile::Write(const void* bytes, std::size_t count) {
-  return std::fwrite(bytes, 1, count, m_file) == count;
+  return count == 0 || std::fwrite(bytes, 1, count, m_file) == count;
 }
 
 bool BitmapFile::Flush() {

@@ -21,6 +21,12 @@ bool MapRows(const vorl_detail::RunControl& control, const dImage& source, const
   });
 }
 
+// The application may have exchanged the table's buffer through its image.
+bool HoldsEntries(dLUT& lut) {
+  lut.GetLUT(0);  // brings the table up to date
+  return vorl_detail::HoldsRows(static_cast<dImage&>(lut));
+}
+
 }  // namespace
 
 VORL_REGISTER_CLASS(opLookup, OpBase);
@@ -56,8 +62,6 @@ bool opLookup::Prepare() {
     m_status.Set(false, "missing source image");
   } else if (!m_pSource->IsValid()) {
     m_status.Set(false, "uninitialized source image");
-  } else if (!vorl_detail::HoldsRows(*m_pSource)) {
-    m_status.Set(false, "invalid pixel data in the source image");
   } else if (m_pSource->GetNumChannels() != 1) {
     m_status.Set(false, "multi channel(%d) source images are not supported",
                  m_pSource->GetNumChannels());
@@ -72,6 +76,10 @@ bool opLookup::Prepare() {
     m_status.Set(false, "LUT has more(%ld) than 1 channel", m_pLUT->GetNumChannels());
   } else if (m_pLUT->GetDataDepth() != 8) {
     m_status.Set(false, "data depth of the LUT(%d bit) must be 8 bit", m_pLUT->GetDataDepth());
+  } else if (!vorl_detail::HoldsRows(*m_pSource)) {
+    m_status.Set(false, "invalid pixel data in the source image");
+  } else if (!HoldsEntries(*m_pLUT)) {
+    m_status.Set(false, "invalid entries in the LUT");
   } else {
     m_lookupMode = m_pSource->GetChannelDepth() == 8 ? kEightToEight : kSixteenToEight;
     m_status = true;

@@ -19,12 +19,13 @@ inline namespace vorl {
 /// last.
 ///
 /// *Errors.* "missing source image", "uninitialized source image", "invalid pixel data in the
-/// source image" (its buffer was exchanged for one that does not hold its rows), "multi channel(%d)
-/// source images are not supported", "invalid channel depth:%d bit(must be 8 or 16 bit)", "missing
-/// LUT", "uninitialized LUT", "LUT has more(%d) than 1 channel", "data depth of the LUT(%d bit)
-/// must be 8 bit", "error while creating image buffer:" followed by the image's message, and
-/// "stopped" after a stop request. A 16-bit source that is replaced stays as it is when the
-/// operator fails; of an 8-bit one, the rows before the stop have been replaced.
+/// source image" and "invalid entries in the LUT" (a buffer was exchanged for one that does not
+/// hold the rows), "multi channel(%d) source images are not supported", "invalid channel depth:%d
+/// bit(must be 8 or 16 bit)", "missing LUT", "uninitialized LUT", "LUT has more(%d) than 1
+/// channel", "data depth of the LUT(%d bit) must be 8 bit", "error while creating image buffer:"
+/// followed by the image's message, and "stopped" after a stop request. A 16-bit source that is
+/// replaced stays as it is when the operator fails; of an 8-bit one, the rows before the stop have
+/// been replaced.
 class VORL_API opLookup : public OpBase {
  public:
   opLookup();

@@ -82,16 +82,16 @@ bool opMinMax::Prepare() {
     m_status.Set(false, "uninitialized source image");
     return false;
   }
-  if (!vorl_detail::HoldsRows(*m_pSource)) {
-    m_status.Set(false, "invalid pixel data in the source image");
-    return false;
-  }
   m_status = true;
   return true;
 }
 
 template <class T>
 bool opMinMax::Search() {
+  if (!vorl_detail::HoldsRows(*m_pSource)) {
+    m_status.Set(false, "invalid pixel data in the source image");
+    return false;
+  }
   std::int32_t minimum = m_minimum;
   std::int32_t maximum = m_maximum;
   const auto row = [&](std::size_t index) {
