@@ -23,6 +23,7 @@ class BinaryDataIn;
 class BinaryDataOut;
 class IBinaryDataIO;
 
+class dASCIIStreamIn;
 class dBCGLUT;
 class dBuffer;
 class dCoordSys1D;
@@ -39,15 +40,19 @@ class dTrafo1D;
 class dTrafo2D;
 class dTrafo3D;
 class dUnitTrafo;
+struct dVOI;
 class dVect2D;
 class dVect3D;
 class dVolume;
 class dWindowingLUT;
 
 class opLookup;
+class opMIP;
 class opMPR;
 class opMinMax;
 class opPixelRescale;
+class opSliceProjection;
+class opVoxelClassification;
 
 }  // namespace vorl
 

@@ -12,6 +12,7 @@
 #include <vorl/Common/LogManager.h>
 #include <vorl/Common/OpBase.h>
 #include <vorl/Common/dStatus.h>
+#include <vorl/Data/dASCIIStream.h>
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dBuffer.h>
 #include <vorl/Data/dCoordSys.h>
@@ -23,15 +24,19 @@
 #include <vorl/Data/dSlice.h>
 #include <vorl/Data/dString.h>
 #include <vorl/Data/dTrafo.h>
+#include <vorl/Data/dVOI.h>
 #include <vorl/Data/dVect2D.h>
 #include <vorl/Data/dVect3D.h>
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/Operators/IP/opLookup.h>
+#include <vorl/Operators/IP/opMIP.h>
 #include <vorl/Operators/IP/opMPR.h>
 #include <vorl/Operators/IP/opMinMax.h>
 #include <vorl/Operators/IP/opPixelRescale.h>
+#include <vorl/Operators/IP/opSliceProjection.h>
+#include <vorl/Operators/IP/opVoxelClassification.h>
 #include <vorl/Platform/Gdi.h>
 #include <vorl/Platform/GdiFwd.h>
 #include <vorl/export.h>

@@ -14,6 +14,7 @@
 #include <thread>
 
 #include "Volumes.h"
+#include "Waiting.h"
 
 namespace {
 
@@ -22,11 +23,13 @@ using rasters::Format;
 using rasters::MessageOf;
 using rasters::Random;
 using rasters::SamplesOf;
+using waiting::kPatience;
+using waiting::WaitForEnd;
+using waiting::WaitForProgress;
 using Samples = std::vector<std::uint16_t>;
 
 constexpr std::uint16_t kVoxel = 7;
 constexpr std::uint16_t kUnwritten = 0x5A5A;
-constexpr auto kPatience = std::chrono::seconds(60);
 
 /// A volume of one voxel's value everywhere and a slice inside it; each row of the slice costs
 /// `depthSteps` samples per pixel.
@@ -56,23 +59,6 @@ struct SlowRun {
   dSlice slice;
   opMPR op;
 };
-
-/// Waits until the operator's run has ended; false when that takes too long.
-bool WaitForEnd(const OpBase& op) {
-  const auto limit = std::chrono::steady_clock::now() + kPatience;
-  while (op.IsRunning() && std::chrono::steady_clock::now() < limit) {
-    std::this_thread::yield();
-  }
-  return !op.IsRunning();
-}
-
-bool WaitForProgress(OpBase& op) {
-  const auto limit = std::chrono::steady_clock::now() + kPatience;
-  while (op.GetProgress() == 0.0 && std::chrono::steady_clock::now() < limit) {
-    std::this_thread::yield();
-  }
-  return op.GetProgress() > 0.0;
-}
 
 TEST(OperatorThread, AStoppedReconstructionEndsBetweenTwoRows) {
   SlowRun run(256, 2048, 100);

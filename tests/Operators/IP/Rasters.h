@@ -119,6 +119,16 @@ class StoppedBeforeWork : public Op {
   }
 };
 
+/// An operator that is asked to stop while it starts.
+template <class Op>
+class StoppedAtStart : public Op {
+ protected:
+  void Start() override {
+    Op::Start();
+    this->m_stopRequested = true;
+  }
+};
+
 /// An image that cannot be formatted.
 class StubbornImage : public dImage {
  public:
@@ -156,15 +166,22 @@ class GuardedMemory {
   /// The guards before and behind the pixels and the padding of each row are as they were, and the
   /// image still shows this memory.
   void ExpectSurroundingsUntouched() const {
-    ASSERT_EQ(m_image->GetDataPtr(), m_memory.data() + kGuard);
+    ExpectGuardsUntouched();
     const unsigned long rowBytes = m_image->GetBytesPerRow();
     const unsigned long used = m_image->GetDataSamplesInRow() * (m_image->GetChannelDepth() / 8U);
-    const std::size_t end = kGuard + m_image->GetImageSize();
-    for (std::size_t i = 0; i < m_memory.size(); ++i) {
-      const bool inside = i >= kGuard && i < end;
-      if (!inside || (i - kGuard) % rowBytes >= used) {
+    for (std::size_t i = kGuard; i < m_memory.size() - kGuard; ++i) {
+      if ((i - kGuard) % rowBytes >= used) {
         ASSERT_EQ(m_memory[i], kMark) << "at byte " << i << " of " << m_memory.size();
       }
+    }
+  }
+
+  /// The same without the padding of the rows.
+  void ExpectGuardsUntouched() const {
+    ASSERT_EQ(m_image->GetDataPtr(), m_memory.data() + kGuard);
+    for (std::size_t i = 0; i < kGuard; ++i) {
+      ASSERT_EQ(m_memory[i], kMark) << i << " bytes into the guard before the pixels";
+      ASSERT_EQ(m_memory[m_memory.size() - 1 - i], kMark) << "in the guard behind the pixels";
     }
   }
 

@@ -5,109 +5,36 @@
 #include <gtest/gtest.h>
 
 #include <array>
-#include <ostream>
 
 #include "MprModel.h"
-#include "Volumes.h"
+#include "Scenes.h"
 
 namespace {
 
 using mpr_model::Coverage;
-using rasters::Format;
 using rasters::GuardedMemory;
 using rasters::Random;
-
-enum class Voxels { Any, Extreme, Small };
-
-// Replaces the pixels, padding included, by values that stress the arithmetic.
-void SetVoxels(dImage& image, Voxels kind, Random& random) {
-  static constexpr std::array<std::uint16_t, 5> kExtremes = {0, 1, 0x7FFF, 0x8000, 0xFFFF};
-  auto* samples = static_cast<std::uint16_t*>(image.GetDataPtr());
-  for (unsigned long i = 0; i < image.GetNumDataSamples(); ++i) {
-    if (kind == Voxels::Extreme) {
-      samples[i] = random.Pick(kExtremes);
-    } else if (kind == Voxels::Small) {
-      samples[i] = static_cast<std::uint16_t>(random.Between(-3, 100));
-    }
-  }
-}
-
-float Quarter(Random& random, int low, int high) {
-  return static_cast<float>(random.Between(low * 4, high * 4)) / 4.0F;
-}
-
-dVect3D RandomVector(Random& random) {
-  const auto component = [&] { return static_cast<float>(random.Between(-2500, 2500)) / 1000.0F; };
-  const float x = component(), y = component(), z = component();
-  return dVect3D(x, y, z);
-}
-
-// Upright, scaled or mirrored, askew, or, rarely, without one of its axes.
-void RandomAxes(dCoordSys3D& system, Random& random) {
-  static constexpr std::array<float, 8> kScales = {1, 0.25F, 2, 0.5F, -1, -0.25F, 0.1F, 30};
-  switch (random.Between(0, 4)) {
-    case 0:
-      break;
-    case 1:
-    case 2:
-      system.axisX *= random.Pick(kScales);
-      system.axisY *= random.Pick(kScales);
-      system.axisZ *= random.Pick(kScales);
-      if (random.Between(0, 2) == 0) {
-        std::swap(system.axisX, system.axisZ);
-      }
-      break;
-    default:
-      system.axisX = RandomVector(random);
-      system.axisY = RandomVector(random);
-      system.axisZ = RandomVector(random);
-  }
-  if (random.Between(0, 15) == 0) {
-    (random.Between(0, 1) != 0 ? system.axisX : system.axisZ) = dVect3D(0, 0, 0);
-  }
-}
 
 template <class T>
 class Case {
  public:
   Case(unsigned short type, Random& random) {
-    static constexpr std::array<unsigned short, 4> kAlignments = {1, 2, 8, 32};
     static constexpr std::array<int, 8> kDepthSteps = {0, 0, -1, -1, 1, 2, 5, 300};
-    const Format slices = {.width = Size(random, 14),
-                           .height = Size(random, 11),
-                           .type = type,
-                           .alignment = random.Pick(kAlignments)};
-    rasters::AddRandomSlices(m_volume, slices, static_cast<int>(Size(random, 9)), random);
-    const auto kind = static_cast<Voxels>(random.Between(0, 2));
-    for (dSlice& slice : m_volume.GetSliceList()) {
-      SetVoxels(slice.GetImage(), kind, random);
-    }
-    m_memory.PutUnder(m_slice.GetImage(), {.width = Size(random, 12),
-                                           .height = Size(random, 9),
+    rasters::MakeRandomVolume(m_volume, type, random);
+    m_memory.PutUnder(m_slice.GetImage(), {.width = rasters::RandomSize(random, 12),
+                                           .height = rasters::RandomSize(random, 9),
                                            .type = type,
-                                           .alignment = random.Pick(kAlignments)});
-    PlaceVolume(random);
-    PlacePlane(random);
+                                           .alignment = rasters::RandomAlignment(random)});
+    rasters::PlacePlane(m_slice, m_volume, random);
     m_op.volume = &m_volume;
     m_op.mprSlice = &m_slice;
     m_op.SelectAlgo(random.Between(101, 102));
     m_op.SetDepthSteps(random.Pick(kDepthSteps));
   }
 
-  friend std::ostream& operator<<(std::ostream& out, const Case& shown) {
-    const auto vector = [&](const char* name, const dVect3D& v) {
-      out << ", " << name << " (" << v.x << ' ' << v.y << ' ' << v.z << ')';
-    };
-    const dVolume& volume = shown.m_volume;
-    out << volume.GetSizeX() << " x " << volume.GetSizeY() << " x " << volume.GetSizeZ() << " to "
-        << shown.m_slice.GetWidth() << " x " << shown.m_slice.GetHeight() << ", algorithm "
-        << shown.m_op.algoID << ", depth steps " << shown.m_op.depthSteps;
-    const dCoordSys3D& plane = shown.m_slice.GetCoordinates();
-    vector("at", plane.origin);
-    vector("axisX", plane.axisX);
-    vector("axisY", plane.axisY);
-    vector("axisZ", plane.axisZ);
-    return out;
+  testing::Message Text() const {
+    return testing::Message() << "algorithm " << m_op.algoID << ", depth steps " << m_op.depthSteps
+                              << ", " << rasters::TextOf(m_volume, m_slice);
   }
 
   void Check(Coverage& coverage) {
@@ -119,36 +46,6 @@ class Case {
   }
 
  private:
-  // One in five is 1.
-  static unsigned long Size(Random& random, int largest) {
-    return random.Between(0, 4) == 0 ? 1UL : static_cast<unsigned long>(random.Between(1, largest));
-  }
-
-  void PlaceVolume(Random& random) {
-    dCoordSys3D& system = m_volume.GetCoordinates();
-    RandomAxes(system, random);
-    system.origin = RandomVector(random);
-    system.origin *= random.Between(0, 1) * 100.0;
-  }
-
-  // Axes relative to the volume's, or free; some pixel of the plane lies at a point in or around
-  // the volume, often on a voxel's border.
-  void PlacePlane(Random& random) {
-    dCoordSys3D& plane = m_slice.GetCoordinates();
-    if (random.Between(0, 3) != 0) {
-      plane = m_volume.GetCoordinates();
-    }
-    RandomAxes(plane, random);
-    dVect3D point(Quarter(random, 0, m_volume.GetSizeX()), Quarter(random, 0, m_volume.GetSizeY()),
-                  Quarter(random, 0, m_volume.GetSizeZ()));
-    if (random.Between(0, 1) == 0) {
-      point += RandomVector(random);
-    }
-    m_volume.GetCoordinates().pCS2W(point, plane.origin);
-    plane.origin -= plane.axisX * random.Between(0, m_slice.GetWidth());
-    plane.origin -= plane.axisY * random.Between(0, m_slice.GetHeight());
-  }
-
   dVolume m_volume;
   dSlice m_slice;
   GuardedMemory m_memory;
@@ -171,7 +68,7 @@ void CheckCases(unsigned short type, std::uint32_t seed) {
   Coverage coverage;
   for (int i = 0; i < 1000; ++i) {
     Case<T> testCase(type, random);
-    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase);
+    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase.Text());
     testCase.Check(coverage);
     if (testing::Test::HasFatalFailure()) {
       return;

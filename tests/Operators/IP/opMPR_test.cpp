@@ -235,18 +235,9 @@ TEST(opMPR, StoppedBeforeItsWorkWritesNothing) {
   EXPECT_EQ(rasters::BytesOf(bench.slice.GetImage()), rasters::Bytes(8, 0x5A));
 }
 
-/// An operator that is asked to stop while it starts.
-class StoppedAtStart : public opMPR {
- protected:
-  void Start() override {
-    opMPR::Start();
-    m_stopRequested = true;
-  }
-};
-
 TEST(opMPR, StoppedBeforeItsPreparationSaysSo) {
   Workbench bench;
-  StoppedAtStart op;
+  rasters::StoppedAtStart<opMPR> op;
   ExpectFailure(op, "missing input parameter 'Volume'");
   op.volume = &bench.volume;
   op.mprSlice = &bench.slice;

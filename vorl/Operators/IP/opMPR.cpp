@@ -6,14 +6,10 @@
 
 #include <vorl/Operators/IP/opMPR.h>
 
-#include <algorithm>
-#include <cstdlib>
-
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
-#include <vorl/Operators/IP/kernels/RowLoop.h>
-#include <vorl/Operators/IP/kernels/SlicePlane.h>
+#include <vorl/Operators/IP/kernels/PlaneLoop.h>
 
 inline namespace vorl {
 
@@ -22,23 +18,6 @@ using vorl_detail::NearestSampler;
 using vorl_detail::SlabSamples;
 using vorl_detail::TrilinearSampler;
 using vorl_detail::VolumeView;
-
-namespace {
-
-// The whole voxels that the slab crosses along its dominant axis.
-std::int32_t VoxelsAcross(const FixedVector& depth) {
-  const std::int64_t largest =
-      std::max({std::llabs(depth.x), std::llabs(depth.y), std::llabs(depth.z)});
-  return static_cast<std::int32_t>(largest >> 16);
-}
-
-SlabSamples SamplesAcross(const FixedVector& depth, std::int32_t depthSteps) {
-  const std::int32_t wanted = depthSteps < 0 ? VoxelsAcross(depth) : depthSteps;
-  const std::int32_t count = std::max(wanted, 2);
-  return {count, depth.DividedBy(count - 1)};
-}
-
-}  // namespace
 
 VORL_REGISTER_CLASS(opMPR, OpBase);
 
@@ -97,8 +76,7 @@ bool opMPR::Process() {
     m_status.Set(false, "unsupported data type: %d", dataType);
     return false;
   }
-  if (const auto invalid = VolumeView(*volume).FindInvalidSlice()) {
-    m_status.Set(false, "invalid pixel data in slice %d of the Volume", *invalid);
+  if (!vorl_detail::CheckPixels(*volume, m_status)) {
     return false;
   }
   if (!vorl_detail::HoldsRows(mprSlice->GetImage())) {
@@ -121,24 +99,17 @@ template <class T, class Sampler>
 bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
   const VolumeView view(source);
   const Sampler sampler(view);
-  // A slab is centred on the plane.
-  const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), thick ? -0.5 : 0.0);
-  const SlabSamples slab = SamplesAcross(plane.depthStep, depthSteps);
-  const dImage& image = target.GetImage();
-  const std::size_t width = image.GetWidth();
-  const FixedVector toNextRow =
-      plane.rowStep - plane.columnStep.Times(static_cast<std::int32_t>(image.GetWidth()));
-  FixedVector point = plane.start;
-  const auto row = [&](std::size_t index) {
-    T* pixels = vorl_detail::RowOf<T>(image, index);
+  const vorl_detail::SlicePlane plane(target, source.GetCoordinates(),
+                                      thick ? vorl_detail::kSlabBegin : 0.0);
+  const SlabSamples slab(plane.depthStep, depthSteps);
+  const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
     if (thick) {
       MprThickRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
     } else {
       MprThinRowRef(view, sampler, point, plane.columnStep, pixels, width);
     }
-    point += toNextRow;
   };
-  vorl_detail::ForEachRow({m_stopRequested, m_progress}, image.GetHeight(), row);
+  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
   return true;
 }
 

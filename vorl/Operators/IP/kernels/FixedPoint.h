@@ -28,6 +28,12 @@ inline std::int32_t WrapMultiply(std::int32_t a, std::int32_t b) {
   return static_cast<std::int32_t>(static_cast<std::uint32_t>(a) * static_cast<std::uint32_t>(b));
 }
 
+/// A number of voxels or pixels in 16.16. From 32,768 on it wraps as the positions do; it is then
+/// at most the size, so nothing outside is ever taken for inside.
+inline std::int32_t FixedSize(std::int32_t size) {
+  return WrapMultiply(size, 65536);
+}
+
 /// The value times 65536, truncated towards zero. A value that does not fit becomes the nearest one
 /// that does; one that is not a number becomes `notANumber`.
 inline std::int32_t ToFixed(double value, std::int32_t notANumber) {

@@ -6,19 +6,13 @@
 /// variants must equal them bit for bit.
 
 #include <vorl/Operators/IP/kernels/Sampling.h>
+#include <vorl/Operators/IP/kernels/Slab.h>
 
 #include <cstddef>
 #include <cstdint>
 
 inline namespace vorl {
 namespace vorl_detail {
-
-/// The samples taken along the normal for each pixel: from the pixel's point on, `count` of them,
-/// `step` apart.
-struct SlabSamples {
-  std::int32_t count;
-  FixedVector step;
-};
 
 /// Samples `width` points from `point` on, `step` apart; 0 outside. `point` ends behind the row.
 template <class T, class Sampler>

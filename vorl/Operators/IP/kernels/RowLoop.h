@@ -19,9 +19,13 @@ struct RunControl {
 };
 
 /// Calls `row(i)` for i = 0 .. count - 1. A stop request is honoured before each row, progress
-/// stored once after each. Returns false when stopped.
+/// stored once after each; where there are no rows, all is done at once. Returns false when
+/// stopped.
 template <class Row>
 bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
+  if (count == 0) {
+    control.progress.store(1.0, std::memory_order_relaxed);
+  }
   for (std::size_t i = 0; i < count; ++i) {
     if (control.stopRequested.load(std::memory_order_relaxed)) {
       return false;

@@ -23,8 +23,12 @@ class NearestSampler {
 
   /// The sample at an inside point.
   std::int32_t operator()(const FixedVector& point) const {
-    const std::ptrdiff_t row = std::ptrdiff_t{point.y >> 16} * m_view.Width();
-    return m_view.Slice<T>(point.z >> 16)[row + (point.x >> 16)];
+    return Voxel(point.x >> 16, point.y >> 16, point.z >> 16);
+  }
+
+  /// The value of a voxel of the volume.
+  std::int32_t Voxel(std::int32_t x, std::int32_t y, std::int32_t z) const {
+    return m_view.Slice<T>(z)[std::ptrdiff_t{y} * m_view.Width() + x];
   }
 
  private:

@@ -1,0 +1,139 @@
+// Random volumes classified and selected from, against a plain model.
+
+#include <vorl/Operators/IP/opVoxelClassification.h>
+
+#include <gtest/gtest.h>
+
+#include <array>
+
+#include "ClassificationBench.h"
+#include "Scenes.h"
+
+namespace {
+
+using classification_bench::Counts;
+using rasters::Random;
+using rasters::Voxels;
+using Entries = std::vector<std::uint32_t>;
+
+struct Classified {
+  std::uint32_t entry;
+  int voxelClass;
+};
+
+/// Every voxel that a classification looks at, in scan order.
+template <class T>
+std::vector<Classified> ClassesOf(const dVolume& volume, int algo) {
+  std::vector<Classified> classes;
+  for (int z = 0; z < volume.GetSizeZ(); ++z) {
+    const dImage& image = volume.GetSlice(z)->GetImage();
+    const auto at = [&](int x, int y) {
+      return int{*static_cast<const T*>(image.GetDataPtr(x, y))};
+    };
+    const auto low = [&](int x, int y) { return ((at(x, y) % 4096) + 4096) % 4096; };
+    const int leftOut = algo == 402 ? 1 : 0;
+    for (int y = 0; y < volume.GetSizeY() - leftOut; ++y) {
+      for (int x = 0; x < volume.GetSizeX() - leftOut; ++x) {
+        const int edge =
+            algo == 402 ? low(x, y) - std::min(low(x + 1, y), low(x, y + 1)) : at(x, y);
+        classes.push_back(
+            {voxel_lists::Pack(static_cast<std::uint32_t>(x), static_cast<std::uint32_t>(y),
+                               static_cast<std::uint32_t>(z)),
+             edge});
+      }
+    }
+  }
+  return classes;
+}
+
+Counts CountsOf(const std::vector<Classified>& classes, int algo) {
+  Counts counts;
+  for (const Classified& voxel : classes) {
+    ++counts[algo == 402 ? std::max(voxel.voxelClass, 0) : voxel.voxelClass];
+  }
+  return counts;
+}
+
+/// The voxels of the highest classes of which no more than `limit` are counted.
+Entries Selected(const std::vector<Classified>& classes, int algo, int highest,
+                 std::uint32_t limit) {
+  const Counts counts = CountsOf(classes, algo);
+  int lowest = -100000;
+  std::uint32_t sum = 0;
+  for (auto it = counts.rbegin(); it != counts.rend(); ++it) {
+    if (sum + it->second > limit) {
+      lowest = it->first + 1;
+      break;
+    }
+    sum += it->second;
+  }
+  Entries entries;
+  for (const Classified& voxel : classes) {
+    if (voxel.voxelClass >= lowest && voxel.voxelClass < highest) {
+      entries.push_back(voxel.entry);
+    }
+  }
+  return entries;
+}
+
+struct Coverage {
+  long none = 0;
+  long some = 0;
+  long all = 0;
+  long highest = 0;  ///< voxels of the class that is never selected
+};
+
+template <class T>
+void CheckCase(unsigned short type, Random& random, Coverage& coverage) {
+  classification_bench::Workbench bench(type);
+  bench.volume.Reset();
+  rasters::MakeRandomVolume(bench.volume, type, random);
+  const int algo = random.Between(401, 402);
+  const bool signedValues = type == ImageDataType_S16 && algo == 401;
+  const std::vector<Classified> classes = ClassesOf<T>(bench.volume, algo);
+
+  bench.Classify(static_cast<short>(algo));
+  ASSERT_EQ(classification_bench::CountsOf(bench.op, signedValues ? 32768 : 0),
+            CountsOf(classes, algo));
+
+  const int highest = signedValues ? 32767 : 65535;
+  for (const Classified& voxel : classes) {
+    coverage.highest += voxel.voxelClass == highest ? 1 : 0;
+  }
+  for (int i = 0; i < 5; ++i) {
+    const auto limit =
+        static_cast<std::uint32_t>(random.Between(1, static_cast<int>(classes.size()) + 2));
+    const Entries expected = Selected(classes, algo, highest, limit);
+    ASSERT_EQ(bench.Select(limit), expected) << "limit " << limit << " of " << classes.size();
+    ++(expected.empty()                    ? coverage.none
+       : expected.size() == classes.size() ? coverage.all
+                                           : coverage.some);
+  }
+}
+
+template <class T>
+void CheckCases(unsigned short type, std::uint32_t seed) {
+  Random random(seed);
+  Coverage coverage;
+  for (int i = 0; i < 400; ++i) {
+    SCOPED_TRACE(testing::Message() << "case " << i);
+    CheckCase<T>(type, random, coverage);
+    if (testing::Test::HasFatalFailure()) {
+      return;
+    }
+  }
+  EXPECT_GT(coverage.none, 100);
+  EXPECT_GT(coverage.some, 500);
+  EXPECT_GT(coverage.all, 20);
+  EXPECT_GT(coverage.highest, 500);
+}
+
+TEST(opVoxelClassificationModel, UnsignedVolumesEqualTheModel) {
+  CheckCases<std::uint16_t>(ImageDataType_U16, 51);
+}
+
+TEST(opVoxelClassificationModel, SignedVolumesEqualTheModel) {
+  CheckCases<std::int16_t>(ImageDataType_S16, 52);
+}
+
+}  // namespace

@@ -1,0 +1,175 @@
+// 1. Prepare checks the inputs.
+// 2. Process picks the worker for algorithm and data type.
+// 3. The slab workers walk the output rows like a thick reconstruction and keep the largest sample
+//    (Mip.h); the voxel-list worker carries listed voxels into the slice.
+
+#include <vorl/Operators/IP/opMIP.h>
+
+#include <algorithm>
+
+#include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/ImageCheck.h>
+#include <vorl/Operators/IP/kernels/Mip.h>
+#include <vorl/Operators/IP/kernels/PlaneLoop.h>
+#include <vorl/Operators/IP/kernels/VolumeProjection.h>
+
+inline namespace vorl {
+
+using vorl_detail::FixedVector;
+using vorl_detail::NearestSampler;
+using vorl_detail::SlabSamples;
+using vorl_detail::TrilinearSampler;
+using vorl_detail::VolumeView;
+
+VORL_REGISTER_CLASS(opMIP, OpBase);
+
+opMIP::opMIP() {
+  opMIP::Reset();
+}
+
+opMIP::opMIP(const opMIP& source) = default;
+opMIP& opMIP::operator=(const opMIP& source) = default;
+
+opMIP::~opMIP() {
+  Terminate();
+  opMIP::Reset();
+}
+
+bool opMIP::Reset() {
+  mipSlice = nullptr;
+  volume = nullptr;
+  voxelList = nullptr;
+  algoID = MIPAlgo_Nearest;
+  depthSteps = -1;
+  return true;
+}
+
+void opMIP::SelectAlgo(int id) {
+  algoID = id;
+}
+
+void opMIP::SetDepthSteps(int count) {
+  depthSteps = count;
+}
+
+bool opMIP::Prepare() {
+  if (volume == nullptr) {
+    m_status.Set(false, "missing input parameter 'Volume'");
+  } else if (!volume->IsValid()) {
+    m_status.Set(false, "given Volume is empty");
+  } else if (mipSlice == nullptr) {
+    m_status.Set(false, "missing input parameter 'MIP Slice'");
+  } else if (mipSlice->GetDataType() != volume->GetDataType()) {
+    m_status.Set(false, "incompatible data types(Volume: 0x%x, Slice: 0x%x", volume->GetDataType(),
+                 mipSlice->GetDataType());
+  } else if (algoID == MIPAlgo_VoxelList && voxelList == nullptr) {
+    m_status.Set(false, "missing input parameter 'Voxel List'");
+  } else if (algoID == MIPAlgo_VoxelList && voxelList->GetSize() == 0) {
+    m_status.Set(false, "'Voxel List' is empty");
+  } else {
+    m_status = true;
+    return m_stopRequested ? Stopped() : true;
+  }
+  return false;
+}
+
+bool opMIP::Process() {
+  if (algoID != MIPAlgo_Nearest && algoID != MIPAlgo_Trilinear && algoID != MIPAlgo_VoxelList) {
+    m_status.Set(false, "invalid MIP Algo ID: %d", algoID);
+    return false;
+  }
+  const unsigned short dataType = volume->GetDataType();
+  if (dataType != ImageDataType_U16 && dataType != ImageDataType_S16) {
+    m_status.Set(false, "unsupported data type: %d", dataType);
+    return false;
+  }
+  if (!vorl_detail::CheckPixels(*volume, m_status)) {
+    return false;
+  }
+  if (!vorl_detail::HoldsRows(mipSlice->GetImage())) {
+    m_status.Set(false, "invalid pixel data in the MIP Slice");
+    return false;
+  }
+  const bool isSigned = dataType == ImageDataType_S16;
+  switch (algoID) {
+    case MIPAlgo_Nearest:
+      isSigned ? MIPNearestS16(*volume, *mipSlice) : MIPNearestU16(*volume, *mipSlice);
+      break;
+    case MIPAlgo_Trilinear:
+      isSigned ? MIPTrilinearS16(*volume, *mipSlice) : MIPTrilinearU16(*volume, *mipSlice);
+      break;
+    default:
+      isSigned ? MIPVoxelListS16(*volume, *voxelList, *mipSlice)
+               : MIPVoxelListU16(*volume, *voxelList, *mipSlice);
+      break;
+  }
+  return m_stopRequested ? Stopped() : true;
+}
+
+template <class T, class Sampler>
+bool opMIP::Project(dVolume& source, dSlice& target) {
+  const VolumeView view(source);
+  const Sampler sampler(view);
+  const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), vorl_detail::kSlabBegin);
+  const SlabSamples slab(plane.depthStep, depthSteps);
+  const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
+    MipRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
+  };
+  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
+  return true;
+}
+
+// A voxel is admitted when its place in the slice is outside in both directions; admitted voxels
+// end the loop once as many as the list is long have come. What lies outside the raster is not
+// drawn, so the slice stays as it is; both rules are kept for the files and programs that rely on
+// them.
+template <class T>
+bool opMIP::ProjectList(dVolume& source, dBuffer& list, dSlice& target) {
+  const VolumeView view(source);
+  const NearestSampler<T> sampler(view);
+  const vorl_detail::VoxelListView voxels(list);
+  const vorl_detail::GridProjection toSlice(source.GetCoordinates(), target.GetCoordinates());
+  const vorl_detail::RasterBounds bounds(target.GetImage());
+  std::size_t left = voxels.Count();
+  const auto draw = [&](std::size_t index) {
+    const vorl_detail::VoxelAddress voxel = voxels[index];
+    const FixedVector place = toSlice(voxel);
+    if (left == 0 || bounds.HoldsRow(place) || bounds.HoldsColumn(place)) {
+      return;
+    }
+    --left;
+    if (bounds.Holds(place) && view.HoldsVoxel(voxel.x, voxel.y, voxel.z)) {
+      T& pixel = vorl_detail::RowOf<T>(target.GetImage(),
+                                       static_cast<std::size_t>(place.y >> 16))[place.x >> 16];
+      pixel = std::max(pixel, static_cast<T>(sampler.Voxel(voxel.x, voxel.y, voxel.z)));
+    }
+  };
+  vorl_detail::ForEachVoxel({m_stopRequested, m_progress}, voxels.Count(), draw);
+  return true;
+}
+
+bool opMIP::MIPNearestU16(dVolume& source, dSlice& target) {
+  return Project<std::uint16_t, NearestSampler<std::uint16_t>>(source, target);
+}
+
+bool opMIP::MIPTrilinearU16(dVolume& source, dSlice& target) {
+  return Project<std::uint16_t, TrilinearSampler<std::uint16_t>>(source, target);
+}
+
+bool opMIP::MIPVoxelListU16(dVolume& source, dBuffer& list, dSlice& target) {
+  return ProjectList<std::uint16_t>(source, list, target);
+}
+
+bool opMIP::MIPNearestS16(dVolume& source, dSlice& target) {
+  return Project<std::int16_t, NearestSampler<std::int16_t>>(source, target);
+}
+
+bool opMIP::MIPTrilinearS16(dVolume& source, dSlice& target) {
+  return Project<std::int16_t, TrilinearSampler<std::int16_t>>(source, target);
+}
+
+bool opMIP::MIPVoxelListS16(dVolume& source, dBuffer& list, dSlice& target) {
+  return ProjectList<std::int16_t>(source, list, target);
+}
+
+}  // namespace vorl
