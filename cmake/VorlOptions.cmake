@@ -18,8 +18,6 @@ if(VORL_SANITIZE)
 endif()
 
 if(VORL_COVERAGE)
-  # Operators run in threads of their own: plain counters would lose counts and go negative.
-  target_compile_options(vorl_options INTERFACE
-    --coverage -fprofile-abs-path -fprofile-update=atomic)
+  # The library alone is measured (see vorl/CMakeLists.txt); everything is linked with the counters.
   target_link_options(vorl_options INTERFACE --coverage)
 endif()
