@@ -123,7 +123,8 @@ VORL_API int SetStretchBltMode(HDC dc, int mode);
 
 // ---- Shapes ----
 
-/// Fills a rectangle with a brush. Returns 0 on failure.
+/// Fills a rectangle with a brush, whatever the binary raster operation. With exchanged corners the
+/// first one is included. Returns 0 on failure.
 VORL_API int FillRect(HDC dc, const RECT* rect, HBRUSH brush);
 /// Draws a rectangle with the selected pen and fills it with the selected brush. False on failure.
 VORL_API BOOL Rectangle(HDC dc, int left, int top, int right, int bottom);
@@ -140,8 +141,8 @@ VORL_API int SetPolyFillMode(HDC dc, int mode);
 /// Sets the binary raster operation (R2_BLACK ... R2_WHITE) of pens, brushes and shapes; returns
 /// the one before, 0 on failure.
 VORL_API int SetROP2(HDC dc, int rop);
-/// Sets one pixel to the nearest colour that the bitmap has, which it returns. CLR_INVALID outside
-/// the bitmap or the clip region, and on failure.
+/// Sets one pixel to the nearest colour that the bitmap has, by the binary raster operation.
+/// Returns that colour; CLR_INVALID outside the bitmap or the clip region, and on failure.
 VORL_API COLORREF SetPixel(HDC dc, int x, int y, COLORREF colour);
 /// The colour of one pixel. CLR_INVALID outside the bitmap or the clip region, and on failure.
 VORL_API COLORREF GetPixel(HDC dc, int x, int y);
