@@ -29,6 +29,11 @@ struct CommandText {
   std::string examples;  ///< whole lines
 };
 
+/// Adds an option that takes one text, which is kept in `target`, to a command.
+CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& target,
+                     const std::string& type, const std::string& description,
+                     const std::string& group);
+
 /// One command of the tool. Constructing it declares its options; after the command line has been
 /// parsed, `Check` turns their texts into values, and `Run` does the work.
 class Command {
@@ -50,7 +55,9 @@ class Command {
  protected:
   /// Adds an option that takes one text.
   CLI::Option* AddText(const std::string& names, std::string& target, const std::string& type,
-                       const std::string& description, const std::string& group);
+                       const std::string& description, const std::string& group) {
+    return cli::AddText(*m_app, names, target, type, description, group);
+  }
   CLI::App& GetApp() { return *m_app; }
 
  private:

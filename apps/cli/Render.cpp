@@ -1,4 +1,5 @@
 #include <cli/Render.h>
+#include <cli/Watch.h>
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/Operators/IP/opLookup.h>
@@ -6,10 +7,8 @@
 #include <vorl/Operators/IP/opPixelRescale.h>
 
 #include <algorithm>
-#include <chrono>
 #include <cmath>
 #include <string>
-#include <thread>
 
 // 1. Place the plane in the world (study::MakePlane) and reconstruct the volume on it (opMPR).
 // 2. Bring the samples under a window that the table can hold, where it could not (opPixelRescale).
@@ -17,39 +16,6 @@
 
 namespace cli {
 namespace {
-
-constexpr std::chrono::milliseconds kPoll(2);
-
-void CheckStatus(const OpBase& op, const std::string& what) {
-  const dStatus& status = op.GetStatus();
-  if (static_cast<long>(status) != 0) {
-    throw study::Error("can't " + what + ": " + static_cast<const char*>(status));
-  }
-}
-
-void WaitForEnd(const OpBase& op) {
-  while (op.IsRunning()) {
-    std::this_thread::sleep_for(kPoll);
-  }
-}
-
-/// Runs an operator in its own thread, so that its progress can be shown and it can be stopped.
-void RunWatched(OpBase& op, const study::Progress& progress, const std::string& doing) {
-  if (!op.RunAsThread(0)) {
-    op.Run();
-    return;
-  }
-  try {
-    while (op.IsRunning()) {
-      study::Report(progress, op.GetProgress(), doing);
-      std::this_thread::sleep_for(kPoll);
-    }
-  } catch (...) {
-    op.Stop();
-    WaitForEnd(op);
-    throw;
-  }
-}
 
 /// The operator walks the volume in 16.16 fixed point; beyond its range it would wrap around and
 /// show the volume again.
