@@ -67,6 +67,7 @@ class Command {
 
 std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
+std::unique_ptr<Command> MakeMipCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
 

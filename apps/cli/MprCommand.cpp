@@ -61,9 +61,7 @@ MprCommand::MprCommand(CLI::App& application)
 }
 
 void MprCommand::AddOutputOptions() {
-  AddText("-o,--output", m_output, "FILE",
-          "The picture, by its extension .png or .bmp, 8-bit grey\n(a device or pipe gets PNG)",
-          kOutputGroup);
+  AddPictureOption(GetApp(), m_output, kOutputGroup);
   AddText("--save-slice", m_slice, "FILE.bdf",
           "The 16-bit samples of the plane as they are, with\n"
           "place, scale, offset and unit: a study file of one\n"

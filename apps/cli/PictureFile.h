@@ -6,10 +6,15 @@
 
 #include <vorl/Data/dImage.h>
 
+#include <CLI/CLI.hpp>
+
 #include <filesystem>
 #include <string>
 
 namespace cli {
+
+/// Declares -o, the picture to write; its name is kept in `target`.
+void AddPictureOption(CLI::App& command, std::string& target, const std::string& group);
 
 /// Throws `UsageError` unless the name ends in .png or .bmp, or is that of a device.
 void CheckPictureName(const std::string& option, const std::string& path);

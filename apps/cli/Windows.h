@@ -38,6 +38,11 @@ RealWindow ResolveWindow(const WindowChoice& choice, study::Study& study);
 /// above; a volume of one value gets a window around it.
 RealWindow AutoWindow(study::Study& study);
 
+/// The same for pictures of the brightest voxels, in which nearly every ray meets soft tissue:
+/// black up to the middle value of all that is not background, white from the value on that one
+/// voxel in a thousand lies above. What is bright in a few places only, such as bones, stands out.
+RealWindow ProjectionWindow(study::Study& study);
+
 /// How a window in real values is shown through the library's table of stored values.
 ///
 /// The table holds the centre within 0 to 65536 and the width within 2 to 65536. A window that fits

@@ -22,7 +22,7 @@ TEST(CommandLine, HelpNamesAllCommandsAndGivesExamples) {
   EXPECT_EQ(outcome.code, 0);
   EXPECT_EQ(outcome.errors, "");
   EXPECT_TRUE(Contains(outcome.output, "Usage: vorl COMMAND ..."));
-  for (const char* part : {"\n  info ", "\n  mpr ", "\n  convert ", "\n  phantom ", "Examples:\n",
+  for (const char* part : {"\n  info ", "\n  mpr ", "\n  mip ", "\n  convert ", "\n  phantom ", "Examples:\n",
                            "The exit code is 0 after success"}) {
     EXPECT_TRUE(Contains(outcome.output, part)) << part;
   }
@@ -64,6 +64,11 @@ INSTANTIATE_TEST_SUITE_P(
                   "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z", "--size WxH", "--spacing MM",
                   "--thickness MM", "--steps N", "--filter NAME", "--window WINDOW",
                   "--brightness B", "--contrast C", "--gamma G", "-q,--quiet"}},
+        HelpCase{"mip",
+                 "INPUT... -o OUT.png|OUT.bmp\n",
+                 {"--series SERIES", "--phantom[=WxHxN]", "-o,--output FILE", "--turntable N",
+                  "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z", "--size WxH", "--spacing MM",
+                  "--slab MM", "--filter NAME", "--window WINDOW", "--gamma G", "-q,--quiet"}},
         HelpCase{"convert", "INPUT... OUT.bdf\n", {"--series SERIES", "--phantom[=WxHxN]"}},
         HelpCase{"phantom", "OUT.bdf\n", {"--size WxHxN", "--encoding NAME"}}),
     [](const auto& one) { return std::string(one.param.command); });
@@ -106,10 +111,10 @@ constexpr const char* kPhantom = "--phantom=4x4x4";
 INSTANTIATE_TEST_SUITE_P(
     Commands, WrongUsage,
     testing::Values(
-        UsageCase{"NoCommand", {}, "no command is named; there are info, mpr, convert, phantom"},
+        UsageCase{"NoCommand", {}, "no command is named; there are info, mpr, mip, convert, phantom"},
         UsageCase{"UnknownCommand",
                   {"show", "x"},
-                  "there is no command 'show'; there are info, mpr, convert, phantom"},
+                  "there is no command 'show'; there are info, mpr, mip, convert, phantom"},
         UsageCase{"OptionInsteadOfCommand",
                   {"--fast"},
                   "the following argument was not expected: --fast"},
