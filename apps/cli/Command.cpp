@@ -22,4 +22,13 @@ CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& t
       ->group(group);
 }
 
+std::string FirstGiven(std::initializer_list<std::pair<const char*, const std::string*>> options) {
+  for (const auto& [name, text] : options) {
+    if (!text->empty()) {
+      return name;
+    }
+  }
+  return {};
+}
+
 }  // namespace cli

@@ -8,9 +8,11 @@
 
 #include <CLI/CLI.hpp>
 
+#include <initializer_list>
 #include <memory>
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 namespace cli {
 
@@ -33,6 +35,9 @@ struct CommandText {
 CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& target,
                      const std::string& type, const std::string& description,
                      const std::string& group);
+
+/// The first name whose text is not empty; empty when all are.
+std::string FirstGiven(std::initializer_list<std::pair<const char*, const std::string*>> options);
 
 /// One command of the tool. Constructing it declares its options; after the command line has been
 /// parsed, `Check` turns their texts into values, and `Run` does the work.
@@ -68,6 +73,8 @@ class Command {
 std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMipCommand(CLI::App& application);
+std::unique_ptr<Command> MakeProjectCommand(CLI::App& application);
+std::unique_ptr<Command> MakeSelectCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
 

@@ -32,8 +32,11 @@ void GreyOptions::Check() {
   }
 }
 
-bool GreyOptions::IsGiven() const {
-  return !m_window.empty() || !m_brightness.empty() || !m_contrast.empty() || !m_gamma.empty();
+std::string GreyOptions::FirstGiven() const {
+  return cli::FirstGiven({{"--window", &m_window},
+                          {"--brightness", &m_brightness},
+                          {"--contrast", &m_contrast},
+                          {"--gamma", &m_gamma}});
 }
 
 bool GreyOptions::WantsAuto() const {

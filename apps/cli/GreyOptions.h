@@ -22,8 +22,8 @@ class GreyOptions {
   void AddTo(CLI::App& command, const std::string& usual = "the input's own window, else auto");
   /// Throws `UsageError`.
   void Check();
-  /// True when the user gave any of the options.
-  bool IsGiven() const;
+  /// The first of the options that stands on the command line, such as "--gamma"; else empty.
+  std::string FirstGiven() const;
   /// True when the window follows from the input and not from numbers or a preset: it was not
   /// given, or is "auto".
   bool WantsAuto() const;

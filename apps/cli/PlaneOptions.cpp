@@ -40,17 +40,10 @@ std::string PlaneOptions::FirstGiven() const {
   if (NamesPlane()) {
     return "--plane";
   }
-  const std::array<std::pair<const char*, const std::string*>, 4> options{
-      {{"--center", &m_centre},
-       {"--rotate", &m_rotation},
-       {"--size", &m_size},
-       {"--spacing", &m_spacing}}};
-  for (const auto& [name, text] : options) {
-    if (!text->empty()) {
-      return name;
-    }
-  }
-  return {};
+  return cli::FirstGiven({{"--center", &m_centre},
+                          {"--rotate", &m_rotation},
+                          {"--size", &m_size},
+                          {"--spacing", &m_spacing}});
 }
 
 study::PlaneRequest PlaneOptions::Check() const {

@@ -139,17 +139,21 @@ TEST_F(Mip, NoLayerIsJumpedOverInAThickSlab) {
 }
 
 TEST_F(Mip, TheUsualWindowLeavesTheMiddleOfAllThatIsNotBackgroundBlack) {
-  // Half of the voxels are background, most others tissue of 1000 to 1002, a few are bone.
+  // Half of the voxels are background, most others tissue of 1000 to 1002, a few are bone, and one
+  // in 20,000 is metal.
   VolumeModel volume = m_volume;
-  volume.size = {100, 20, 1};
-  volume.stored = [](int i, int j, int) { return j < 10 ? 0 : i < 4 ? 2000 : 1000 + i % 3; };
+  volume.size = {200, 100, 1};
+  volume.stored = [](int i, int j, int) {
+    return j < 50 ? (i == 7 && j == 7 ? 30000 : 0) : i < 4 ? 2001 : 1000 + i % 3;
+  };
   cli_test::WriteVolume(volume, PathOf("volume.bdf"));
   const Outcome outcome = RunTool({"mip", PathOf("volume.bdf"), "-o", PathOf("a.png")});
   EXPECT_EQ(outcome.errors, "");
   const Picture picture = ReadPng(PathOf("a.png"));
   EXPECT_EQ(picture.At(50, 5), 0);
-  EXPECT_EQ(picture.At(51, 15), 0);
-  EXPECT_EQ(picture.At(2, 15), 255);
+  EXPECT_EQ(picture.At(100, 60), 0);             // 1001: black begins here
+  EXPECT_NEAR(picture.At(2, 60), 255 / 1.1, 2);  // 2001: a tenth below white
+  EXPECT_EQ(picture.At(7, 7), 255);
 }
 
 TEST_F(Mip, TurntableViewsGoAroundTheBodyFromTheFrontToTheLeft) {
