@@ -55,18 +55,20 @@ class MipCommand : public Command {
 };
 
 MipCommand::MipCommand(CLI::App& application)
-    : Command(application,
-              {"mip", "Project the brightest voxels of a volume into a picture",
-               "[OPTIONS] INPUT... -o OUT.png|OUT.bmp\n"
-               "[OPTIONS] --phantom[=WxHxN] -o OUT.png|OUT.bmp",
-               "  vorl mip scans/ --plane coronal -o front.png\n"
-               "  vorl mip scans/ --slab 20 --center 10,-25,730 -o slab.png\n"
-               "  vorl mip scans/ --filter linear --window 400,1200 -o bones.png\n"
-               "  vorl mip scans/ --turntable 36 -o film/turn.png\n\n"
-               "Every pixel shows the largest value on the ray behind it. Directions and\n"
-               "positions are those of 'vorl mpr'. The window 'auto' leaves what is not\n"
-               "background dark up to its middle value, so that the bones of a CT are bright;\n"
-               "it follows from the whole volume and is the same for all views of it."}) {
+    : Command(
+          application,
+          {"mip", "Project the brightest voxels of a volume into a picture",
+           "[OPTIONS] INPUT... -o OUT.png|OUT.bmp\n"
+           "[OPTIONS] --phantom[=WxHxN] -o OUT.png|OUT.bmp",
+           "  vorl mip scans/ --plane coronal -o front.png\n"
+           "  vorl mip scans/ --slab 20 --center 10,-25,730 -o slab.png\n"
+           "  vorl mip scans/ --plane sagittal --window 400,1200 -o bones.png\n"
+           "  vorl mip scans/ --turntable 36 -o film/turn.png\n\n"
+           "Every pixel shows the largest value on the ray behind it. Directions and\n"
+           "positions are those of 'vorl mpr'. The window 'auto' leaves what is not\n"
+           "background dark up to its middle value, so that the bones of a CT are bright;\n"
+           "it follows from the whole volume and is the same for all views of it. With the\n"
+           "linear filter, edges that rays cross at a slant come out brighter than they are."}) {
   m_input.AddTo(GetApp());
   AddPictureOption(GetApp(), m_output, kOutputGroup);
   AddText("--turntable", m_turntable, "N",
