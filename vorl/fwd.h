@@ -54,6 +54,10 @@ class opPixelRescale;
 class opSliceProjection;
 class opVoxelClassification;
 
+class Rect2D;
+class Trafo1D;
+class UnitTrafo;
+
 }  // namespace vorl
 
 #endif

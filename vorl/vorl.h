@@ -29,6 +29,8 @@
 #include <vorl/Data/dVect3D.h>
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
+#include <vorl/GUI/Rect2D.h>
+#include <vorl/GUI/Trafo1D.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/Operators/IP/opLookup.h>
 #include <vorl/Operators/IP/opMIP.h>
