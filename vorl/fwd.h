@@ -54,8 +54,16 @@ class opPixelRescale;
 class opSliceProjection;
 class opVoxelClassification;
 
+class AnchoredTrafo2D;
+class MultiTrafo2D;
 class Rect2D;
+class Rotate2D;
+class Scale2D;
 class Trafo1D;
+class Trafo2DBase;
+class TrafoSRT2D;
+class TrafoST2D;
+class Translate2D;
 class UnitTrafo;
 
 }  // namespace vorl

@@ -31,6 +31,7 @@
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
+#include <vorl/GUI/Trafo2D.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/Operators/IP/opLookup.h>
 #include <vorl/Operators/IP/opMIP.h>
