@@ -55,6 +55,8 @@ class opSliceProjection;
 class opVoxelClassification;
 
 class AnchoredTrafo2D;
+class Geom2D;
+class Geom3D;
 class MultiTrafo2D;
 class Rect2D;
 class Rotate2D;

@@ -29,6 +29,7 @@
 #include <vorl/Data/dVect3D.h>
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
+#include <vorl/GUI/Geom2D.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
