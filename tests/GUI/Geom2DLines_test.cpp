@@ -78,6 +78,43 @@ TEST(Geom2DClipLine, ALineThatMissesLeavesTheOutputs) {
   EXPECT_TRUE(Same(end, 3, 4));
 }
 
+TEST(Geom2DClipLine, EndsLieExactlyOnTheEdgesHoweverFarThePointsAre) {
+  // At such distances the plain sum of point and way is off by up to a tenth.
+  Numbers numbers(183);
+  for (int i = 0; i < 200; ++i) {
+    const float far = 1e12F * (1.0F + std::abs(numbers.Next()));
+    const float step = 1.0F + std::abs(numbers.Next());
+    dVect2D start, end;
+    ASSERT_TRUE(
+        Geom2D::ClipLine(dVect2D(-far, 30.0F), dVect2D(far * step, 30.0F), kRect, start, end));
+    ASSERT_TRUE(Same(start, 10, 30));
+    ASSERT_TRUE(Same(end, 50, 30));
+    ASSERT_TRUE(
+        Geom2D::ClipLine(dVect2D(40.0F, far), dVect2D(40.0F, -far * step), kRect, start, end));
+    ASSERT_TRUE(Same(start, 40, 60));
+    ASSERT_TRUE(Same(end, 40, 20));
+  }
+}
+
+TEST(Geom2DClipLine, EndsNeverLieOutside) {
+  // Past a corner from very far: the coordinate that is not cut is rounded to either side of it.
+  Numbers numbers(184);
+  const Rect2D edges(kRect);
+  int hits = 0;
+  for (int i = 0; i < 2000; ++i) {
+    const float farX = -1e15F * (1.0F + std::abs(numbers.Next()));
+    const float farY = -1e15F * (1.0F + std::abs(numbers.Next()));
+    dVect2D start, end;
+    const dVect2D nearCorner(50.0F + 0.1F * numbers.Next(), 60.0F + 0.1F * numbers.Next());
+    if (Geom2D::ClipLine(dVect2D(farX, farY), nearCorner, kRect, start, end)) {
+      ++hits;
+      ASSERT_TRUE(edges.IsInside(start)) << start.x << ' ' << start.y;
+      ASSERT_TRUE(edges.IsInside(end)) << end.x << ' ' << end.y;
+    }
+  }
+  EXPECT_GT(hits, 100);
+}
+
 TEST(Geom2DClipLine, TakesAnAngleInRadians) {
   dVect2D start, end;
   ASSERT_TRUE(Geom2D::ClipLine(dVect2D(30.0F, 40.0F), 0, kRect, start, end));
