@@ -79,18 +79,18 @@ TEST(Geom2DClipLine, ALineThatMissesLeavesTheOutputs) {
 }
 
 TEST(Geom2DClipLine, EndsLieExactlyOnTheEdgesHoweverFarThePointsAre) {
-  // At such distances the plain sum of point and way is off by up to a tenth.
+  // At such distances the plain sum of point and way misses the edge.
   Numbers numbers(183);
   for (int i = 0; i < 200; ++i) {
-    const float far = 1e12F * (1.0F + std::abs(numbers.Next()));
+    const float distance = 1e12F * (1.0F + std::abs(numbers.Next()));
     const float step = 1.0F + std::abs(numbers.Next());
     dVect2D start, end;
-    ASSERT_TRUE(
-        Geom2D::ClipLine(dVect2D(-far, 30.0F), dVect2D(far * step, 30.0F), kRect, start, end));
+    ASSERT_TRUE(Geom2D::ClipLine(dVect2D(-distance, 30.0F), dVect2D(distance * step, 30.0F), kRect,
+                                 start, end));
     ASSERT_TRUE(Same(start, 10, 30));
     ASSERT_TRUE(Same(end, 50, 30));
-    ASSERT_TRUE(
-        Geom2D::ClipLine(dVect2D(40.0F, far), dVect2D(40.0F, -far * step), kRect, start, end));
+    ASSERT_TRUE(Geom2D::ClipLine(dVect2D(40.0F, distance), dVect2D(40.0F, -distance * step), kRect,
+                                 start, end));
     ASSERT_TRUE(Same(start, 40, 60));
     ASSERT_TRUE(Same(end, 40, 20));
   }
