@@ -46,6 +46,7 @@ class dVect3D;
 class dVolume;
 class dWindowingLUT;
 
+class opDIB2Ima;
 class opLookup;
 class opMIP;
 class opMPR;

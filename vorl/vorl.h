@@ -30,6 +30,7 @@
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/IO/BinaryDataIO.h>
+#include <vorl/IO/File/opDIB2Ima.h>
 #include <vorl/Operators/IP/opLookup.h>
 #include <vorl/Operators/IP/opMIP.h>
 #include <vorl/Operators/IP/opMPR.h>
