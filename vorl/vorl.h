@@ -39,7 +39,10 @@
 #include <vorl/Operators/IP/opSliceProjection.h>
 #include <vorl/Operators/IP/opVoxelClassification.h>
 #include <vorl/Platform/Gdi.h>
+#include <vorl/Platform/GdiConstants.h>
+#include <vorl/Platform/GdiFunctions.h>
 #include <vorl/Platform/GdiFwd.h>
+#include <vorl/Platform/GdiTypes.h>
 #include <vorl/export.h>
 #include <vorl/fwd.h>
 
