@@ -1,7 +1,5 @@
 #include <vorl/Platform/soft/DeviceContext.h>
 
-#include <cstring>
-
 inline namespace vorl {
 namespace vorl_detail {
 namespace {
@@ -33,7 +31,7 @@ void DeviceContext::Update() {
   m_surface = state.bitmap->surface;
   if (screen) {
     m_surface = Surface{};
-    m_surface.format = TrueColour();
+    m_surface.format = DefaultFormat(32);
   } else if (state.bitmap->stock) {
     m_surface.top = m_ownPixel;
   }
@@ -44,8 +42,21 @@ void DeviceContext::Update() {
   m_visible = std::move(visible);
 }
 
+// In bitmaps of one bit the two colours that there are, and the background colour, are drawn as
+// what they are, or are nearest to; every other colour stands out from the background.
 std::uint32_t DeviceContext::PixelOf(COLORREF colour) const {
-  return NearestPixel(m_surface.format, colour);
+  const PixelFormat& format = m_surface.format;
+  if (format.depth != 1) {
+    return NearestPixel(format, colour);
+  }
+  const COLORREF plain = colour & 0xFFFFFFU;
+  for (std::uint32_t pixel = 0; pixel < 2; ++pixel) {
+    if (plain == ColourOf(format, pixel)) {
+      return pixel;
+    }
+  }
+  const std::uint32_t background = NearestPixel(format, state.backgroundColour);
+  return plain == (state.backgroundColour & 0xFFFFFFU) ? background : background ^ 1U;
 }
 
 }  // namespace vorl_detail

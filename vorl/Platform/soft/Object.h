@@ -6,6 +6,7 @@
 #include <vorl/Platform/soft/Surface.h>
 
 #include <cstdint>
+#include <cstdlib>
 #include <memory>
 #include <vector>
 
@@ -58,6 +59,11 @@ struct RegionObject : Object {
   const Region region;
 };
 
+/// Gives memory from `std::calloc` back.
+struct FreeMemory {
+  void operator()(std::uint8_t* memory) const { std::free(memory); }
+};
+
 /// A bitmap section or a device bitmap; it owns its pixels. The pixels change while contexts draw.
 struct Bitmap : Object {
   static constexpr ObjectKind kKind = ObjectKind::kBitmap;
@@ -67,7 +73,7 @@ struct Bitmap : Object {
   bool bottomUp = false;      ///< the first row in memory is the bottom one
   BITMAPINFOHEADER header{};  ///< of a section
   int rowBytes = 0;           ///< as GetObjectA reports them
-  std::unique_ptr<std::uint8_t[]> pixels;
+  std::unique_ptr<std::uint8_t, FreeMemory> pixels;
 };
 
 }  // namespace vorl_detail

@@ -69,7 +69,7 @@ std::shared_ptr<Bitmap> StockBitmap() {
     auto made = MakeStock<Bitmap>();
     made->surface.width = 1;
     made->surface.height = 1;
-    made->surface.format.monochrome = true;
+    made->surface.format = DefaultFormat(1);
     made->rowBytes = 2;
     return made;
   }());

@@ -51,13 +51,6 @@ bool PixelFormat::HasDefaultMasks() const {
   return depth == 16 ? masks == kMasks16 : depth != 32 || masks == kMasks32;
 }
 
-PixelFormat TrueColour() {
-  PixelFormat format;
-  format.depth = 32;
-  format.masks = kMasks32;
-  return format;
-}
-
 bool SamePixels(const PixelFormat& a, const PixelFormat& b) {
   if (a.depth != b.depth || a.monochrome != b.monochrome) {
     return false;
@@ -67,6 +60,12 @@ bool SamePixels(const PixelFormat& a, const PixelFormat& b) {
   }
   return a.colourCount == b.colourCount &&
          std::equal(a.colours.begin(), a.colours.begin() + a.colourCount, b.colours.begin());
+}
+
+std::uint64_t RowBytes(int width, int depth, int alignment) {
+  const std::uint64_t bits = static_cast<std::uint64_t>(width) * static_cast<std::uint64_t>(depth);
+  const auto step = static_cast<std::uint64_t>(alignment);
+  return (bits + step - 1) / step * (step / 8);
 }
 
 std::uint32_t ReadPixel(const std::uint8_t* row, int x, int depth) {

@@ -29,8 +29,9 @@ struct PixelFormat {
   bool HasDefaultMasks() const;
 };
 
-/// The format of 32 bits without colours or unusual masks.
-PixelFormat TrueColour();
+/// The format of a depth without colours or unusual masks: 1 bit is monochrome, 4 and 8 bits have
+/// the system's colours.
+PixelFormat DefaultFormat(int depth);
 
 /// Do pixels of one format mean the same in the other, so that they may be copied as they are?
 bool SamePixels(const PixelFormat& a, const PixelFormat& b);
@@ -47,6 +48,9 @@ struct Surface {
   RECT Bounds() const { return RECT{0, 0, width, height}; }
   bool Contains(int x, int y) const { return x >= 0 && y >= 0 && x < width && y < height; }
 };
+
+/// The bytes of a row whose length is padded to a multiple of `alignment` bits.
+std::uint64_t RowBytes(int width, int depth, int alignment);
 
 /// The value of the pixel at column x of a row.
 std::uint32_t ReadPixel(const std::uint8_t* row, int x, int depth);
