@@ -29,6 +29,7 @@ class dBuffer;
 class dCoordSys1D;
 class dCoordSys2D;
 class dCoordSys3D;
+class dDIB;
 class dImaDescriptorDIB;
 class dImage;
 class dLUT;
@@ -54,6 +55,8 @@ class opMinMax;
 class opPixelRescale;
 class opSliceProjection;
 class opVoxelClassification;
+
+class vIma2Device;
 
 }  // namespace vorl
 

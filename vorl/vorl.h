@@ -16,6 +16,7 @@
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dBuffer.h>
 #include <vorl/Data/dCoordSys.h>
+#include <vorl/Data/dDIB.h>
 #include <vorl/Data/dImaDescriptorDIB.h>
 #include <vorl/Data/dImage.h>
 #include <vorl/Data/dLUT.h>
@@ -29,6 +30,7 @@
 #include <vorl/Data/dVect3D.h>
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
+#include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/IO/File/opDIB2Ima.h>
 #include <vorl/Operators/IP/opLookup.h>
