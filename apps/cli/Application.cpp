@@ -43,6 +43,7 @@ Commands DeclareCommands(CLI::App& app) {
   commands.push_back(MakeMprCommand(app));
   commands.push_back(MakeConvertCommand(app));
   commands.push_back(MakePhantomCommand(app));
+  commands.push_back(MakeBmpCommand(app));
   return commands;
 }
 

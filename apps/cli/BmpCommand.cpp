@@ -41,7 +41,8 @@ std::string HeaderLines(const std::string& path) {
   if (!file || header.biSize != sizeof(header)) {
     return {};
   }
-  std::string depth = std::to_string(header.biBitCount) + " bits per pixel";
+  std::string depth = std::to_string(header.biBitCount) +
+                      (header.biBitCount == 1 ? " bit" : " bits") + " per pixel";
   if (header.biClrUsed != 0) {
     depth += ", " + std::to_string(header.biClrUsed) + " colours";
   }

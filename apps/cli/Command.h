@@ -62,6 +62,7 @@ std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
+std::unique_ptr<Command> MakeBmpCommand(CLI::App& application);
 
 }  // namespace cli
 

@@ -22,8 +22,8 @@ TEST(CommandLine, HelpNamesAllCommandsAndGivesExamples) {
   EXPECT_EQ(outcome.code, 0);
   EXPECT_EQ(outcome.errors, "");
   EXPECT_TRUE(Contains(outcome.output, "Usage: vorl COMMAND ..."));
-  for (const char* part : {"\n  info ", "\n  mpr ", "\n  convert ", "\n  phantom ", "Examples:\n",
-                           "The exit code is 0 after success"}) {
+  for (const char* part : {"\n  info ", "\n  mpr ", "\n  convert ", "\n  phantom ", "\n  bmp ",
+                           "Examples:\n", "The exit code is 0 after success"}) {
     EXPECT_TRUE(Contains(outcome.output, part)) << part;
   }
   EXPECT_EQ(RunTool({"-h"}).output, outcome.output);
@@ -106,10 +106,11 @@ constexpr const char* kPhantom = "--phantom=4x4x4";
 INSTANTIATE_TEST_SUITE_P(
     Commands, WrongUsage,
     testing::Values(
-        UsageCase{"NoCommand", {}, "no command is named; there are info, mpr, convert, phantom"},
+        UsageCase{
+            "NoCommand", {}, "no command is named; there are info, mpr, convert, phantom, bmp"},
         UsageCase{"UnknownCommand",
                   {"show", "x"},
-                  "there is no command 'show'; there are info, mpr, convert, phantom"},
+                  "there is no command 'show'; there are info, mpr, convert, phantom, bmp"},
         UsageCase{"OptionInsteadOfCommand",
                   {"--fast"},
                   "the following argument was not expected: --fast"},
