@@ -84,7 +84,7 @@ VORL_API HBITMAP CreateCompatibleBitmap(HDC dc, int width, int height);
 /// A device bitmap of 1, 4, 8, 16, 24 or 32 bits; with one bit it is monochrome: colours become
 /// white where they equal the background colour, and 0 and 1 become the text and the background
 /// colour. `bits` holds rows padded to 2 bytes, top row first; null leaves the pixels 0. An empty
-/// size gives the 1 by 1 stock bitmap. Null on failure.
+/// size gives the 1 by 1 stock bitmap. Contexts accept depths of 1 and 32. Null on failure.
 VORL_API HBITMAP CreateBitmap(int width, int height, UINT planes, UINT bitCount, const void* bits);
 /// A device bitmap that suits the context, of the size that `header` tells; with CBM_INIT in
 /// `flags` it receives the picture of `bits` and `info`. Null on failure.

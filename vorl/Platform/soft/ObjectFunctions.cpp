@@ -23,8 +23,14 @@ HGDIOBJ Replace(DeviceContext& context, Selected<T> DrawState::*member,
   return before;
 }
 
+// Device bitmaps have to suit the screen, with which all contexts are compatible, or be monochrome.
+bool SuitsScreen(const Bitmap& bitmap) {
+  const int depth = bitmap.surface.format.depth;
+  return bitmap.section || depth == 1 || depth == 32;
+}
+
 HGDIOBJ SelectBitmap(DeviceContext& context, std::shared_ptr<Object> object) {
-  if (context.screen) {
+  if (context.screen || !SuitsScreen(static_cast<const Bitmap&>(*object))) {
     SetError(ERROR_INVALID_PARAMETER);
     return nullptr;
   }
