@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstring>
 #include <string>
 
@@ -224,6 +225,20 @@ TEST_F(opDIB2ImaFile, PaletteLongerThanTheIndicesReachIsReadAsFarAsTheyDo) {
   const dImage image = Read(bitmap);
   ASSERT_STREQ(image.GetChannelSequence(), "G");
   EXPECT_EQ(std::memcmp(image.GetDataPtr(), "\x07\x07\x07\x07", 4), 0);
+}
+
+TEST_F(opDIB2ImaFile, UsualGreyPaletteLeavesTheIndicesAsTheyAre) {
+  std::vector<Colour> palette = Ramp(256, true);
+  std::reverse(palette.begin(), palette.end());
+  const Bitmap bitmap = EightBit(palette, {0, 77, 254, 255});
+  const dImage image = Read(bitmap);
+  ASSERT_STREQ(image.GetChannelSequence(), "G");
+  EXPECT_EQ(std::memcmp(image.GetDataPtr(), "\x00\x4D\xFE\xFF", 4), 0);
+  // One entry that differs, and none of the indices is copied.
+  palette[255] = {254, 254, 254};
+  EXPECT_EQ(
+      std::memcmp(Read(EightBit(palette, {0, 77, 254, 255})).GetDataPtr(), "\x00\x4D\xFE\xFE", 4),
+      0);
 }
 
 TEST_F(opDIB2ImaFile, NoPaletteAtAllIsGreyAndBlack) {

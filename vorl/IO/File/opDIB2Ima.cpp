@@ -36,6 +36,17 @@ int TargetBits(const BitmapSource& source) {
   }
 }
 
+/// True when every index stands for the grey level of its own number: the usual palette of grey
+/// pictures, whose rows need no conversion.
+bool IsPlainRamp(const BitmapSource& source) {
+  for (std::size_t i = 0; i < source.palette.size(); ++i) {
+    if (source.palette[i].rgbBlue != i) {
+      return false;
+    }
+  }
+  return true;
+}
+
 bool IsTargetDepth(int bits) {
   return bits == 1 || bits == 8 || bits == 24 || bits == 32;
 }
@@ -104,7 +115,8 @@ class RowConverter {
       : m_source(source),
         m_image(image),
         m_targetBits(targetBits),
-        m_isCopied(targetBits == source.header.biBitCount && targetBits != 8) {}
+        m_isCopied(targetBits == source.header.biBitCount &&
+                   (targetBits != 8 || IsPlainRamp(source))) {}
 
   /// False, with the reason, when there is no memory or a row cannot be read.
   bool Run(dStatus& status) {
