@@ -6,7 +6,6 @@
 #include <cstring>
 #include <limits>
 
-#include <vorl/Data/detail/BitmapFile.h>
 #include <vorl/Platform/detail/File.h>
 
 inline namespace vorl {
@@ -87,6 +86,7 @@ bool BitmapInFile::Open(const char* path, dStatus& status) {
     status.Set(false, "unable to open file '%s'", path);
     return false;
   }
+  m_buffer.Attach(m_file.get());
   return ReadHeaders(status);
 }
 

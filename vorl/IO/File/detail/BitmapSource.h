@@ -5,6 +5,7 @@
 /// Where a bitmap to be converted comes from: memory, or a file.
 
 #include <vorl/Common/dStatus.h>
+#include <vorl/Data/detail/BitmapFile.h>
 #include <vorl/Platform/Gdi.h>
 
 #include <array>
@@ -86,6 +87,7 @@ class BitmapInFile : public BitmapSource {
   bool ReadHeaders(dStatus& status);
   bool Read(void* target, std::size_t bytes);
 
+  RowBuffer m_buffer;
   std::unique_ptr<std::FILE, CloseFile> m_file;
   const char* m_path = nullptr;
 };
