@@ -25,6 +25,11 @@ get_target_property(library_type vorl TYPE)
 set(VORL_PACKAGE_DEPENDENCIES "")
 if(library_type STREQUAL "STATIC_LIBRARY")
   set(VORL_PACKAGE_DEPENDENCIES "include(CMakeFindDependencyMacro)\nfind_dependency(Threads)\n")
+  if(NOT WIN32)
+    string(APPEND VORL_PACKAGE_DEPENDENCIES
+      "find_dependency(PkgConfig)\n"
+      "pkg_check_modules(VORL_DEVICE REQUIRED IMPORTED_TARGET pixman-1 freetype2 fontconfig)\n")
+  endif()
 endif()
 configure_package_config_file(cmake/vorlConfig.cmake.in ${PROJECT_BINARY_DIR}/vorlConfig.cmake
   INSTALL_DESTINATION ${package_dir})

@@ -9,21 +9,26 @@
 # fails only when there is no CMake or no C++ compiler to go on with.
 set -euo pipefail
 
-# group  package           what it is for
+# group  package            what it is for
 packages='
-build    ca-certificates   secure downloads
-build    cmake             the build system, 3.20 or newer
-build    g++               the compiler; any C++20 compiler will do
-build    ninja-build       runs the build
-build    libcli11-dev      the command line of the tool
-build    libdcmtk-dev      reads DICOM series
-build    libpng-dev        writes pictures
-test     libbenchmark-dev  the benchmarks
-test     libgmock-dev      the tests
-test     libgtest-dev      the tests
-check    clang-format      the format check; version 14 decides
-tidy     clang-tidy        static analysis
-coverage gcovr             the line coverage report
+build    ca-certificates    secure downloads
+build    cmake              the build system, 3.20 or newer
+build    g++                the compiler; any C++20 compiler will do
+build    ninja-build        runs the build
+build    fonts-dejavu-core  the fonts that texts are drawn with
+build    libcli11-dev       the command line of the tool
+build    libdcmtk-dev       reads DICOM series
+build    libfontconfig-dev  finds fonts
+build    libfreetype-dev    draws glyphs
+build    libpixman-1-dev    clip regions
+build    libpng-dev         writes pictures
+build    pkg-config         finds the libraries that the graphics device uses
+test     libbenchmark-dev   the benchmarks
+test     libgmock-dev       the tests
+test     libgtest-dev       the tests
+check    clang-format       the format check; version 14 decides
+tidy     clang-tidy         static analysis
+coverage gcovr              the line coverage report
 '
 
 die() {

@@ -29,6 +29,7 @@ class dBuffer;
 class dCoordSys1D;
 class dCoordSys2D;
 class dCoordSys3D;
+class dDIB;
 class dImaDescriptorDIB;
 class dImage;
 class dLUT;
@@ -46,6 +47,7 @@ class dVect3D;
 class dVolume;
 class dWindowingLUT;
 
+class opDIB2Ima;
 class opLookup;
 class opMIP;
 class opMPR;
@@ -67,6 +69,7 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class vIma2Device;
 
 }  // namespace vorl
 

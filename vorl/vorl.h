@@ -16,6 +16,7 @@
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dBuffer.h>
 #include <vorl/Data/dCoordSys.h>
+#include <vorl/Data/dDIB.h>
 #include <vorl/Data/dImaDescriptorDIB.h>
 #include <vorl/Data/dImage.h>
 #include <vorl/Data/dLUT.h>
@@ -33,7 +34,9 @@
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
+#include <vorl/IO/File/opDIB2Ima.h>
 #include <vorl/Operators/IP/opLookup.h>
 #include <vorl/Operators/IP/opMIP.h>
 #include <vorl/Operators/IP/opMPR.h>
@@ -42,7 +45,10 @@
 #include <vorl/Operators/IP/opSliceProjection.h>
 #include <vorl/Operators/IP/opVoxelClassification.h>
 #include <vorl/Platform/Gdi.h>
+#include <vorl/Platform/GdiConstants.h>
+#include <vorl/Platform/GdiFunctions.h>
 #include <vorl/Platform/GdiFwd.h>
+#include <vorl/Platform/GdiTypes.h>
 #include <vorl/export.h>
 #include <vorl/fwd.h>
 

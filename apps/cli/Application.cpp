@@ -49,6 +49,7 @@ Commands DeclareCommands(CLI::App& app) {
   commands.push_back(MakeSelectCommand(app));
   commands.push_back(MakeConvertCommand(app));
   commands.push_back(MakePhantomCommand(app));
+  commands.push_back(MakeBmpCommand(app));
   return commands;
 }
 

@@ -77,6 +77,7 @@ std::unique_ptr<Command> MakeProjectCommand(CLI::App& application);
 std::unique_ptr<Command> MakeSelectCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
+std::unique_ptr<Command> MakeBmpCommand(CLI::App& application);
 
 }  // namespace cli
 

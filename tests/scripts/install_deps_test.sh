@@ -55,7 +55,8 @@ expect_output_contains() {
   esac
 }
 
-build_packages='ca-certificates cmake g++ ninja-build libcli11-dev libdcmtk-dev libpng-dev'
+build_packages='ca-certificates cmake g++ ninja-build fonts-dejavu-core libcli11-dev libdcmtk-dev'
+build_packages+=' libfontconfig-dev libfreetype-dev libpixman-1-dev libpng-dev pkg-config'
 test_packages='libbenchmark-dev libgmock-dev libgtest-dev'
 install='apt-get install -y --no-install-recommends'
 

@@ -24,7 +24,7 @@ TEST(CommandLine, HelpNamesAllCommandsAndGivesExamples) {
   EXPECT_TRUE(Contains(outcome.output, "Usage: vorl COMMAND ..."));
   for (const char* part :
        {"\n  info ", "\n  mpr ", "\n  mip ", "\n  project ", "\n  select ", "\n  convert ",
-        "\n  phantom ", "Examples:\n", "The exit code is 0 after success"}) {
+        "\n  phantom ", "\n  bmp ", "Examples:\n", "The exit code is 0 after success"}) {
     EXPECT_TRUE(Contains(outcome.output, part)) << part;
   }
   EXPECT_EQ(RunTool({"-h"}).output, outcome.output);
@@ -124,11 +124,11 @@ INSTANTIATE_TEST_SUITE_P(
         UsageCase{"NoCommand",
                   {},
                   "no command is named; there are info, mpr, mip, project, select, convert, "
-                  "phantom"},
+                  "phantom, bmp"},
         UsageCase{"UnknownCommand",
                   {"show", "x"},
                   "there is no command 'show'; there are info, mpr, mip, project, select, convert, "
-                  "phantom"},
+                  "phantom, bmp"},
         UsageCase{"OptionInsteadOfCommand",
                   {"--fast"},
                   "the following argument was not expected: --fast"},

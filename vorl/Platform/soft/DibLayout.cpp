@@ -1,0 +1,150 @@
+#include <vorl/Platform/soft/DibLayout.h>
+
+#include <vorl/Platform/soft/HandleTable.h>
+
+#include <algorithm>
+#include <cstring>
+#include <limits>
+#include <new>
+
+inline namespace vorl {
+namespace vorl_detail {
+namespace {
+
+constexpr std::uint64_t kMaximumBytes = 0x7FFFFFFF;
+constexpr DWORD kHeaderSizeWithMasks = 52;  // longer headers hold the masks themselves
+
+bool IsKnownDepth(int depth) {
+  return depth == 1 || depth == 4 || depth == 8 || depth == 16 || depth == 24 || depth == 32;
+}
+
+const char* BehindHeader(const BITMAPINFO* info, DWORD headerSize) {
+  return reinterpret_cast<const char*>(info) + headerSize;
+}
+
+bool ReadMasks(const BITMAPINFO* info, DibLayout* layout) {
+  const DWORD size = layout->header.biSize;
+  const DWORD offset = size >= kHeaderSizeWithMasks ? DWORD{sizeof(BITMAPINFOHEADER)} : size;
+  std::memcpy(layout->format.masks.data(), BehindHeader(info, offset), 12);
+  const auto& masks = layout->format.masks;
+  return masks[0] != 0 && masks[1] != 0 && masks[2] != 0;
+}
+
+void ReadColours(const BITMAPINFO* info, DibLayout* layout) {
+  const DWORD possible = DWORD{1} << layout->format.depth;
+  const DWORD used = layout->header.biClrUsed;
+  layout->format.colourCount = static_cast<int>(used == 0 ? possible : std::min(used, possible));
+  const char* table = BehindHeader(info, layout->header.biSize);
+  for (int i = 0; i < layout->format.colourCount; ++i) {
+    RGBQUAD colour;
+    std::memcpy(&colour, table + static_cast<std::size_t>(i) * sizeof colour, sizeof colour);
+    layout->format.colours[static_cast<std::size_t>(i)] =
+        RGB(colour.rgbRed, colour.rgbGreen, colour.rgbBlue);
+  }
+}
+
+std::unique_ptr<std::uint8_t, FreeMemory> Zeros(std::uint64_t bytes) {
+  std::unique_ptr<std::uint8_t, FreeMemory> memory(
+      static_cast<std::uint8_t*>(std::calloc(static_cast<std::size_t>(bytes), 1)));
+  if (!memory) {
+    throw std::bad_alloc();
+  }
+  return memory;
+}
+
+}  // namespace
+
+Surface DibLayout::Over(std::uint8_t* pixels) const {
+  Surface surface;
+  surface.pitch = static_cast<std::ptrdiff_t>(rowBytes);
+  surface.top = pixels;
+  if (bottomUp) {
+    surface.top += surface.pitch * (height - 1);
+    surface.pitch = -surface.pitch;
+  }
+  surface.width = width;
+  surface.height = height;
+  surface.format = format;
+  return surface;
+}
+
+std::optional<DibLayout> ReadHeader(const BITMAPINFOHEADER& header) {
+  const int depth = header.biBitCount;
+  const bool hasMasks = header.biCompression == BI_BITFIELDS && (depth == 16 || depth == 32);
+  SetError(ERROR_INVALID_PARAMETER);  // until all is well
+  if (header.biSize < sizeof header || header.biPlanes != 1 || !IsKnownDepth(depth) ||
+      (header.biCompression != BI_RGB && !hasMasks) || header.biWidth <= 0 ||
+      header.biHeight == 0 || header.biHeight == std::numeric_limits<LONG>::min()) {
+    return std::nullopt;
+  }
+  DibLayout layout;
+  layout.header = header;
+  layout.format = DefaultFormat(depth);
+  layout.format.monochrome = false;
+  layout.width = header.biWidth;
+  layout.height = std::abs(header.biHeight);
+  layout.bottomUp = header.biHeight > 0;
+  layout.rowBytes = RowBytes(layout.width, depth, 32);
+  if (layout.Bytes() > kMaximumBytes) {
+    return std::nullopt;
+  }
+  return layout;
+}
+
+std::optional<DibLayout> ReadLayout(const BITMAPINFO* info, UINT usage) {
+  if (info == nullptr || usage != DIB_RGB_COLORS) {
+    SetError(ERROR_INVALID_PARAMETER);
+    return std::nullopt;
+  }
+  const DWORD before = GetLastError();
+  BITMAPINFOHEADER header;
+  std::memcpy(&header, info, sizeof header);
+  auto layout = ReadHeader(header);
+  if (!layout || (header.biCompression == BI_BITFIELDS && !ReadMasks(info, &*layout))) {
+    return std::nullopt;
+  }
+  if (layout->format.depth <= 8) {
+    layout->format.colours.fill(0);
+    ReadColours(info, &*layout);
+  }
+  SetError(before);
+  return layout;
+}
+
+std::shared_ptr<Bitmap> MakeSection(const DibLayout& layout) {
+  auto bitmap = std::make_shared<Bitmap>();
+  bitmap->pixels = Zeros(layout.Bytes());
+  bitmap->surface = layout.Over(bitmap->pixels.get());
+  bitmap->section = true;
+  bitmap->bottomUp = layout.bottomUp;
+  bitmap->rowBytes = static_cast<int>(layout.rowBytes);
+  bitmap->header = layout.header;
+  bitmap->header.biSize = sizeof(BITMAPINFOHEADER);
+  bitmap->header.biHeight = layout.height;
+  bitmap->header.biSizeImage = static_cast<DWORD>(layout.Bytes());
+  bitmap->header.biClrUsed = static_cast<DWORD>(layout.format.colourCount);
+  return bitmap;
+}
+
+std::shared_ptr<Bitmap> MakeDeviceBitmap(std::int64_t width, std::int64_t height, int depth) {
+  constexpr std::int64_t kMaximumSide = 0x7FFFFFF;
+  if (width > kMaximumSide || height > kMaximumSide ||
+      RowBytes(static_cast<int>(width), depth, 16) * static_cast<std::uint64_t>(height) >
+          kMaximumBytes) {
+    SetError(ERROR_NOT_ENOUGH_MEMORY);
+    return nullptr;
+  }
+  auto bitmap = std::make_shared<Bitmap>();
+  bitmap->rowBytes = static_cast<int>(RowBytes(static_cast<int>(width), depth, 16));
+  bitmap->pixels =
+      Zeros(static_cast<std::uint64_t>(bitmap->rowBytes) * static_cast<std::uint64_t>(height));
+  bitmap->surface.top = bitmap->pixels.get();
+  bitmap->surface.pitch = bitmap->rowBytes;
+  bitmap->surface.width = static_cast<int>(width);
+  bitmap->surface.height = static_cast<int>(height);
+  bitmap->surface.format = DefaultFormat(depth);
+  return bitmap;
+}
+
+}  // namespace vorl_detail
+}  // namespace vorl
