@@ -21,7 +21,7 @@
 /// the context draws into a monochrome bitmap of one pixel. Ends with `DeleteDC`. Null on failure.
 VORL_API HDC CreateCompatibleDC(HDC dc);
 /// Deletes a memory device context; the objects selected into it are released, not deleted. False
-/// for anything that is not a device context.
+/// for anything that is not a memory device context.
 VORL_API BOOL DeleteDC(HDC dc);
 /// The device context of the screen, for a null window: it has 32 bits per pixel and nothing that
 /// could be drawn on. Ends with `ReleaseDC`. Null for any window: there are none.

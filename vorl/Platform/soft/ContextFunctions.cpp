@@ -19,7 +19,14 @@ HDC CreateCompatibleDC(HDC dc) {
 }
 
 BOOL DeleteDC(HDC dc) {
-  return Guarded(FALSE, [&]() -> BOOL { return HandleTable::Instance().Remove(dc, true); });
+  return Guarded(FALSE, [&]() -> BOOL {
+    const auto context = Find<DeviceContext>(dc);
+    if (!context || context->screen) {
+      SetError(ERROR_INVALID_HANDLE);
+      return FALSE;
+    }
+    return HandleTable::Instance().Remove(dc, true);
+  });
 }
 
 HDC GetDC(HWND window) {

@@ -7,13 +7,14 @@ inline namespace vorl {
 namespace vorl_detail {
 namespace {
 
-// The lowest two bits stay 0, as in addresses; the place follows, then its generation. Generation 0
-// is never used: small numbers are no handles.
+// The lowest two bits stay 0, as in addresses; the place follows, then its generation. Generations
+// have their highest bit set: small numbers and the addresses of applications are no handles.
 constexpr unsigned kIndexShift = 2;
 constexpr unsigned kIndexBits = 18;
 constexpr unsigned kGenerationShift = kIndexShift + kIndexBits;
 constexpr std::size_t kMaximumPlaces = std::size_t{1} << kIndexBits;
 constexpr std::uintptr_t kMaximumGeneration = ~std::uintptr_t{0} >> kGenerationShift;
+constexpr std::uintptr_t kFirstGeneration = kMaximumGeneration / 2 + 1;
 
 void* HandleOf(std::size_t index, std::uintptr_t generation) {
   return std::bit_cast<void*>(generation << kGenerationShift | index << kIndexShift);
@@ -55,7 +56,9 @@ void* HandleTable::Add(const std::shared_ptr<Object>& object) {
     m_places.emplace_back();
   }
   Place& place = m_places[index];
-  place.generation = place.generation == kMaximumGeneration ? 1 : place.generation + 1;
+  place.generation = place.generation < kFirstGeneration || place.generation == kMaximumGeneration
+                         ? kFirstGeneration
+                         : place.generation + 1;
   place.object = object;
   object->handle = HandleOf(index, place.generation);
   if (object->stock) {
