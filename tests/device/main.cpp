@@ -15,7 +15,12 @@ int main(int argc, char** argv) {
     LineScenes();
     Rop2Scenes();
     PenScenes();
+    OctantScenes();
+    DashScenes();
+    WideScenes();
     ShapeScenes();
+    PolygonScenes();
+    RectangleScenes();
     ClipScenes();
     BlitScenes();
     Rop3Scenes();
@@ -26,6 +31,7 @@ int main(int argc, char** argv) {
     MirrorScenes();
     BitmapScenes();
     DibScenes();
+    TextScenes();
     StateScenes();
     HandleScenes();
   });

@@ -113,10 +113,12 @@ struct LineUnits {
   std::int64_t descent;
   std::int64_t gap;
   std::int64_t averageWidth;
+  std::int64_t strikeOut;  // the middle of the line, above the baseline
 };
 
 LineUnits LineUnitsOf(FT_Face face) {
-  LineUnits units{face->ascender, -std::int64_t{face->descender}, 0, face->units_per_EM / 2};
+  LineUnits units{face->ascender, -std::int64_t{face->descender}, 0, face->units_per_EM / 2,
+                  face->ascender / 3};
   const auto* os2 = static_cast<const TT_OS2*>(FT_Get_Sfnt_Table(face, FT_SFNT_OS2));
   if (os2 != nullptr && os2->usWinAscent + os2->usWinDescent > 0) {
     const std::int64_t height = std::int64_t{os2->usWinAscent} + os2->usWinDescent;
@@ -124,6 +126,7 @@ LineUnits LineUnitsOf(FT_Face face) {
     units.ascent = os2->usWinAscent;
     units.descent = os2->usWinDescent;
     units.averageWidth = os2->xAvgCharWidth;
+    units.strikeOut = os2->yStrikeoutPosition;
   }
   return units;
 }
@@ -236,7 +239,7 @@ void FontFace::SetMetrics(long pixelSize) {
   m_metrics.lineThickness = std::max(1, scaled(m_face->underline_thickness));
   m_metrics.underlineTop =
       std::max(1, scaled(-std::int64_t{m_face->underline_position}) - m_metrics.lineThickness / 2);
-  m_metrics.strikeOutTop = -m_metrics.ascent / 3;
+  m_metrics.strikeOutTop = -scaled(units.strikeOut) - m_metrics.lineThickness / 2;
 }
 
 FontFace::~FontFace() {

@@ -17,6 +17,7 @@ namespace {
 using vorl_detail::DeviceContext;
 using vorl_detail::FontFace;
 using vorl_detail::Region;
+using vorl_detail::TextFormat;
 using vorl_detail::TextLine;
 using vorl_detail::TextRun;
 
@@ -49,36 +50,49 @@ struct Block {
   }
 };
 
-Block LayOut(std::string_view text, FontFace& font, const RECT& rect, UINT format) {
+// Lines that would begin below a rectangle that clips are neither drawn nor counted.
+void DropHiddenLines(Block& block, const RECT& rect, const TextFormat& format) {
+  if ((format.flags & (DT_NOCLIP | DT_CALCRECT | DT_SINGLELINE)) != 0 || block.lineHeight <= 0) {
+    return;
+  }
+  const std::int64_t height = std::int64_t{rect.bottom} - rect.top;
+  const std::int64_t shown = height < 0 ? 1 : height / block.lineHeight + 1;
+  if (shown < static_cast<std::int64_t>(block.lines.size())) {
+    block.lines.resize(static_cast<std::size_t>(shown));
+  }
+}
+
+Block LayOut(std::string_view text, FontFace& font, const RECT& rect, const TextFormat& format) {
   Block block{vorl_detail::LayOutText(vorl_detail::DecodeUtf8(text), font, format, WidthOf(rect)),
               font.Metrics().Height(), rect.top};
-  if ((format & DT_EXTERNALLEADING) != 0) {
+  if ((format.flags & DT_EXTERNALLEADING) != 0) {
     block.lineHeight += font.Metrics().externalLeading;
   }
   // Several lines start at the top whatever the format says.
-  if ((format & DT_SINGLELINE) != 0) {
+  if ((format.flags & DT_SINGLELINE) != 0) {
     const std::int64_t height = std::int64_t{rect.bottom} - rect.top;
-    if ((format & DT_VCENTER) != 0) {
+    if ((format.flags & DT_VCENTER) != 0) {
       block.top += height / 2 - block.lineHeight / 2;
-    } else if ((format & DT_BOTTOM) != 0) {
+    } else if ((format.flags & DT_BOTTOM) != 0) {
       block.top += height - block.lineHeight;
     }
   }
+  DropHiddenLines(block, rect, format);
   return block;
 }
 
-std::int64_t LineStart(const TextLine& line, const RECT& rect, UINT format) {
+std::int64_t LineStart(const TextLine& line, const RECT& rect, const TextFormat& format) {
   const std::int64_t room = WidthOf(rect) - line.width;
-  if ((format & DT_CENTER) != 0) {
+  if ((format.flags & DT_CENTER) != 0) {
     return rect.left + HalfBelow(room);
   }
-  return rect.left + ((format & DT_RIGHT) != 0 ? room : 0);
+  return rect.left + ((format.flags & DT_RIGHT) != 0 ? room : 0);
 }
 
 void Draw(const DeviceContext& dc, FontFace& font, const Block& block, const RECT& rect,
-          UINT format) {
+          const TextFormat& format) {
   Region clip(dc.Visible());
-  if ((format & DT_NOCLIP) == 0) {
+  if ((format.flags & DT_NOCLIP) == 0) {
     if (vorl_detail::IsEmpty(rect)) {
       return;
     }
@@ -95,29 +109,32 @@ void Draw(const DeviceContext& dc, FontFace& font, const Block& block, const REC
 }
 
 // An empty text has the height of a line but takes no room, unless it is a single line.
-int DrawNothing(int lineHeight, RECT& rect, UINT format) {
-  if ((format & DT_CALCRECT) != 0) {
+int DrawNothing(int lineHeight, RECT& rect, const TextFormat& format) {
+  if ((format.flags & DT_CALCRECT) != 0) {
     rect.right = rect.left;
-    rect.bottom =
-        (format & DT_SINGLELINE) != 0 ? Saturated(std::int64_t{rect.top} + lineHeight) : rect.top;
+    rect.bottom = (format.flags & DT_SINGLELINE) != 0
+                      ? Saturated(std::int64_t{rect.top} + lineHeight)
+                      : rect.top;
   }
   return lineHeight;
 }
 
-int DrawInContext(const DeviceContext& dc, std::string_view text, RECT& rect, UINT format) {
+int DrawInContext(const DeviceContext& dc, std::string_view text, RECT& rect,
+                  const TextFormat& format) {
   const std::shared_ptr<FontFace> font = FontFace::Find(dc.state.font->description);
   if (text.empty()) {
     return DrawNothing(font->Metrics().Height(), rect, format);
   }
   const Block block = LayOut(text, *font, rect, format);
   const std::int64_t height = block.Bottom() - rect.top;
-  if ((format & DT_CALCRECT) != 0) {
+  if ((format.flags & DT_CALCRECT) != 0) {
     rect.right = Saturated(rect.left + block.Width());
     rect.bottom = Saturated(block.Bottom());
   } else {
     Draw(dc, *font, block, rect, format);
   }
-  return Saturated(height);
+  // 0 would mean failure.
+  return height == 0 && block.lineHeight > 0 ? 1 : Saturated(height);
 }
 
 }  // namespace
@@ -136,7 +153,7 @@ int DrawTextA(HDC dc, LPCSTR text, int count, LPRECT rect, UINT format) {
       return 0;
     }
     const std::size_t length = count < 0 ? std::strlen(text) : static_cast<std::size_t>(count);
-    return DrawInContext(*context, std::string_view(text, length), *rect, format);
+    return DrawInContext(*context, std::string_view(text, length), *rect, TextFormat(format));
   });
 }
 

@@ -32,20 +32,32 @@ std::vector<Character> WithoutPrefixes(const std::u32string& text, bool hasPrefi
   return characters;
 }
 
+// Of several ampersands in a line the last one counts.
+const Character* LastUnderlined(Characters characters) {
+  const Character* last = nullptr;
+  for (const Character& character : characters) {
+    last = character.isUnderlined ? &character : last;
+  }
+  return last;
+}
+
 // Places characters one after the other and measures them on the way.
 class Ruler {
  public:
-  Ruler(FontFace& font, UINT format) : m_font(font), m_expandsTabs((format & DT_EXPANDTABS) != 0) {
-    const std::int64_t characters = (format & DT_TABSTOP) != 0 ? (format >> 8U) & 0xFFU : 8;
-    m_tabStop = std::max<std::int64_t>(1, characters * font.Metrics().averageWidth);
-  }
+  Ruler(FontFace& font, const TextFormat& format)
+      : m_font(font),
+        m_expandsTabs((format.flags & DT_EXPANDTABS) != 0),
+        m_tabStop(std::max(1, format.tabCharacters * font.Metrics().averageWidth)) {}
+
+  bool IsTab(const Character& character) const { return m_expandsTabs && character.code == U'\t'; }
 
   TextLine Place(Characters characters) const {
     TextLine line;
     bool startsRun = true;
+    const Character* const underlined = LastUnderlined(characters);
     for (const Character& character : characters) {
       if (IsTab(character)) {
-        line.width = (line.width / m_tabStop + 1) * m_tabStop;
+        line.width = NextTabStop(line.width);
         startsRun = true;
         continue;
       }
@@ -55,19 +67,22 @@ class Ruler {
       }
       TextRun& run = line.runs.back();
       const int advance = m_font.GlyphOf(character.code).advance;
-      run.characters.push_back({character.code, line.width, advance, character.isUnderlined});
+      run.characters.push_back({character.code, line.width, advance, &character == underlined});
       run.width += advance;
       line.width += advance;
     }
     return line;
   }
 
-  // How many characters fit into a width.
-  std::size_t Fitting(Characters characters, std::int64_t limit) const {
+  // The place of the first character that goes beyond a width. Tabs may.
+  std::size_t FirstBeyond(Characters characters, std::int64_t limit) const {
     std::int64_t width = 0;
     for (std::size_t i = 0; i < characters.size(); ++i) {
-      width = IsTab(characters[i]) ? (width / m_tabStop + 1) * m_tabStop
-                                   : width + m_font.GlyphOf(characters[i].code).advance;
+      if (IsTab(characters[i])) {
+        width = NextTabStop(width);
+        continue;
+      }
+      width += m_font.GlyphOf(characters[i].code).advance;
       if (width > limit) {
         return i;
       }
@@ -76,7 +91,7 @@ class Ruler {
   }
 
  private:
-  bool IsTab(const Character& character) const { return m_expandsTabs && character.code == U'\t'; }
+  std::int64_t NextTabStop(std::int64_t x) const { return (x / m_tabStop + 1) * m_tabStop; }
 
   FontFace& m_font;
   bool m_expandsTabs;
@@ -96,8 +111,8 @@ bool IsWordCharacter(char32_t code) {
 bool IsBreak(Characters paragraph, std::size_t place) {
   const char32_t before = paragraph[place - 1].code;
   const bool isHyphen = before == U'-' || before == U'/' || before == U'!' || before == U'?';
-  return IsSpace(before) || (isHyphen && place > 1 && place < paragraph.size() &&
-                             IsWordCharacter(paragraph[place].code));
+  return IsSpace(before) ||
+         (isHyphen && place < paragraph.size() && IsWordCharacter(paragraph[place].code));
 }
 
 struct Wrap {
@@ -105,15 +120,20 @@ struct Wrap {
   std::size_t next;  // where the next one starts
 };
 
-// Where the first line of a paragraph that does not fit ends: `fitting` characters of it fit.
-Wrap FirstLine(Characters paragraph, std::size_t fitting, bool isLeftAligned) {
-  std::size_t end = fitting;
-  while (end > 0 && !IsBreak(paragraph, end)) {
+// Where the first line of a paragraph that does not fit ends: the character at `overflow` is the
+// first one that does not. Only what stands behind the last expanded tab can be broken.
+Wrap FirstLine(Characters paragraph, std::size_t overflow, const Ruler& ruler, bool isLeftAligned) {
+  std::size_t end = overflow;
+  while (end > 0 && !ruler.IsTab(paragraph[end - 1]) && !IsBreak(paragraph, end)) {
     --end;
   }
-  if (end == 0) {  // the first word alone is too wide
-    end = fitting;
-    while (end < paragraph.size() && !IsSpace(paragraph[end].code)) {
+  if (end == 0 || ruler.IsTab(paragraph[end - 1])) {  // the first word alone is too wide
+    end = overflow;
+    while (end < paragraph.size() &&
+           (ruler.IsTab(paragraph[end]) || !IsSpace(paragraph[end].code))) {
+      ++end;
+    }
+    if (end < paragraph.size() && paragraph[end].code == U'\t') {
       ++end;
     }
   }
@@ -128,12 +148,12 @@ Wrap FirstLine(Characters paragraph, std::size_t fitting, bool isLeftAligned) {
 void AppendWrapped(std::vector<TextLine>& lines, Characters paragraph, const Ruler& ruler,
                    std::int64_t limit, bool isLeftAligned) {
   for (;;) {
-    const std::size_t fitting = ruler.Fitting(paragraph, limit);
-    if (fitting == paragraph.size()) {
+    const std::size_t overflow = ruler.FirstBeyond(paragraph, limit);
+    if (overflow == paragraph.size()) {
       lines.push_back(ruler.Place(paragraph));
       return;
     }
-    const Wrap wrap = FirstLine(paragraph, fitting, isLeftAligned);
+    const Wrap wrap = FirstLine(paragraph, overflow, ruler, isLeftAligned);
     if (wrap.next == paragraph.size() && wrap.end == wrap.next) {
       lines.push_back(ruler.Place(paragraph));
       return;
@@ -163,15 +183,16 @@ Characters TakeParagraph(Characters& text) {
 
 }  // namespace
 
-std::vector<TextLine> LayOutText(const std::u32string& text, FontFace& font, UINT format,
-                                 std::int64_t limit) {
-  const std::vector<Character> characters = WithoutPrefixes(text, (format & DT_NOPREFIX) == 0);
+std::vector<TextLine> LayOutText(const std::u32string& text, FontFace& font,
+                                 const TextFormat& format, std::int64_t limit) {
+  const std::vector<Character> characters =
+      WithoutPrefixes(text, (format.flags & DT_NOPREFIX) == 0);
   const Ruler ruler(font, format);
-  if ((format & DT_SINGLELINE) != 0) {
+  if ((format.flags & DT_SINGLELINE) != 0) {
     return {ruler.Place(characters)};
   }
-  const bool isLeftAligned = (format & (DT_CENTER | DT_RIGHT)) == 0;
-  const bool wraps = (format & DT_WORDBREAK) != 0 && limit >= 0;
+  const bool isLeftAligned = (format.flags & (DT_CENTER | DT_RIGHT)) == 0;
+  const bool wraps = (format.flags & DT_WORDBREAK) != 0 && limit >= 0;
   std::vector<TextLine> lines;
   Characters rest = characters;
   while (!rest.empty()) {
