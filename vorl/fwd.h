@@ -29,6 +29,7 @@ class dBuffer;
 class dCoordSys1D;
 class dCoordSys2D;
 class dCoordSys3D;
+class dDIB;
 class dImaDescriptorDIB;
 class dImage;
 class dLUT;
@@ -46,6 +47,7 @@ class dVect3D;
 class dVolume;
 class dWindowingLUT;
 
+class opDIB2Ima;
 class opLookup;
 class opMIP;
 class opMPR;
@@ -53,6 +55,21 @@ class opMinMax;
 class opPixelRescale;
 class opSliceProjection;
 class opVoxelClassification;
+
+class AnchoredTrafo2D;
+class Geom2D;
+class Geom3D;
+class MultiTrafo2D;
+class Rect2D;
+class Rotate2D;
+class Scale2D;
+class Trafo1D;
+class Trafo2DBase;
+class TrafoSRT2D;
+class TrafoST2D;
+class Translate2D;
+class UnitTrafo;
+class vIma2Device;
 
 }  // namespace vorl
 

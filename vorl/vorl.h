@@ -16,6 +16,7 @@
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dBuffer.h>
 #include <vorl/Data/dCoordSys.h>
+#include <vorl/Data/dDIB.h>
 #include <vorl/Data/dImaDescriptorDIB.h>
 #include <vorl/Data/dImage.h>
 #include <vorl/Data/dLUT.h>
@@ -29,7 +30,13 @@
 #include <vorl/Data/dVect3D.h>
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
+#include <vorl/GUI/Geom2D.h>
+#include <vorl/GUI/Rect2D.h>
+#include <vorl/GUI/Trafo1D.h>
+#include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
+#include <vorl/IO/File/opDIB2Ima.h>
 #include <vorl/Operators/IP/opLookup.h>
 #include <vorl/Operators/IP/opMIP.h>
 #include <vorl/Operators/IP/opMPR.h>

@@ -16,7 +16,7 @@ namespace {
 
 constexpr char kDescription[] =
     "vorl looks at image volumes: it tells what is in a DICOM series, cuts planes out of\n"
-    "it, and converts it into study files.\n\n"
+    "it, projects it, lists its brightest voxels, and converts it into study files.\n\n"
     "An INPUT is a folder with a DICOM series, the files of one, or a study file (.bdf);\n"
     "--phantom stands for a built-in torso.";
 constexpr char kFooter[] =
@@ -24,6 +24,9 @@ constexpr char kFooter[] =
     "  vorl info scans/\n"
     "  vorl mpr scans/ --plane coronal --window bone -o coronal.png\n"
     "  vorl mpr --phantom --plane oblique -o oblique.png\n"
+    "  vorl mip scans/ --turntable 36 -o film/turn.png\n"
+    "  vorl project scans/ -o view.png\n"
+    "  vorl select scans/ --limit 2% -o bones.bdf --draw bones.png\n"
     "  vorl convert scans/ study.bdf\n\n"
     "'vorl COMMAND --help' tells more. The exit code is 0 after success, 1 when something\n"
     "failed (or was ended with Ctrl-C), 2 when the command line is wrong. Output files\n"
@@ -41,8 +44,12 @@ Commands DeclareCommands(CLI::App& app) {
   Commands commands;
   commands.push_back(MakeInfoCommand(app));
   commands.push_back(MakeMprCommand(app));
+  commands.push_back(MakeMipCommand(app));
+  commands.push_back(MakeProjectCommand(app));
+  commands.push_back(MakeSelectCommand(app));
   commands.push_back(MakeConvertCommand(app));
   commands.push_back(MakePhantomCommand(app));
+  commands.push_back(MakeBmpCommand(app));
   return commands;
 }
 

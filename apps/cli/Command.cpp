@@ -13,13 +13,22 @@ Command::Command(CLI::App& application, const CommandText& text)
       ->group(kGeneralGroup);
 }
 
-CLI::Option* Command::AddText(const std::string& names, std::string& target,
-                              const std::string& type, const std::string& description,
-                              const std::string& group) {
-  return m_app->add_option(names, target, description)
+CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& target,
+                     const std::string& type, const std::string& description,
+                     const std::string& group) {
+  return command.add_option(names, target, description)
       ->option_text(type)
       ->type_name(type)
       ->group(group);
+}
+
+std::string FirstGiven(std::initializer_list<std::pair<const char*, const std::string*>> options) {
+  for (const auto& [name, text] : options) {
+    if (!text->empty()) {
+      return name;
+    }
+  }
+  return {};
 }
 
 }  // namespace cli

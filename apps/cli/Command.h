@@ -8,9 +8,11 @@
 
 #include <CLI/CLI.hpp>
 
+#include <initializer_list>
 #include <memory>
 #include <stdexcept>
 #include <string>
+#include <utility>
 
 namespace cli {
 
@@ -28,6 +30,14 @@ struct CommandText {
   std::string usage;     ///< what follows the command's name; several lines are several forms
   std::string examples;  ///< whole lines
 };
+
+/// Adds an option that takes one text, which is kept in `target`, to a command.
+CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& target,
+                     const std::string& type, const std::string& description,
+                     const std::string& group);
+
+/// The first name whose text is not empty; empty when all are.
+std::string FirstGiven(std::initializer_list<std::pair<const char*, const std::string*>> options);
 
 /// One command of the tool. Constructing it declares its options; after the command line has been
 /// parsed, `Check` turns their texts into values, and `Run` does the work.
@@ -50,7 +60,9 @@ class Command {
  protected:
   /// Adds an option that takes one text.
   CLI::Option* AddText(const std::string& names, std::string& target, const std::string& type,
-                       const std::string& description, const std::string& group);
+                       const std::string& description, const std::string& group) {
+    return cli::AddText(*m_app, names, target, type, description, group);
+  }
   CLI::App& GetApp() { return *m_app; }
 
  private:
@@ -60,8 +72,12 @@ class Command {
 
 std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
+std::unique_ptr<Command> MakeMipCommand(CLI::App& application);
+std::unique_ptr<Command> MakeProjectCommand(CLI::App& application);
+std::unique_ptr<Command> MakeSelectCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);
+std::unique_ptr<Command> MakeBmpCommand(CLI::App& application);
 
 }  // namespace cli
 

@@ -1,4 +1,6 @@
+#include <cli/Cuts.h>
 #include <cli/Render.h>
+#include <cli/Watch.h>
 #include <vorl/Data/dBCGLUT.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/Operators/IP/opLookup.h>
@@ -6,10 +8,8 @@
 #include <vorl/Operators/IP/opPixelRescale.h>
 
 #include <algorithm>
-#include <chrono>
 #include <cmath>
 #include <string>
-#include <thread>
 
 // 1. Place the plane in the world (study::MakePlane) and reconstruct the volume on it (opMPR).
 // 2. Bring the samples under a window that the table can hold, where it could not (opPixelRescale).
@@ -17,69 +17,6 @@
 
 namespace cli {
 namespace {
-
-constexpr std::chrono::milliseconds kPoll(2);
-
-void CheckStatus(const OpBase& op, const std::string& what) {
-  const dStatus& status = op.GetStatus();
-  if (static_cast<long>(status) != 0) {
-    throw study::Error("can't " + what + ": " + static_cast<const char*>(status));
-  }
-}
-
-void WaitForEnd(const OpBase& op) {
-  while (op.IsRunning()) {
-    std::this_thread::sleep_for(kPoll);
-  }
-}
-
-/// Runs an operator in its own thread, so that its progress can be shown and it can be stopped.
-void RunWatched(OpBase& op, const study::Progress& progress, const std::string& doing) {
-  if (!op.RunAsThread(0)) {
-    op.Run();
-    return;
-  }
-  try {
-    while (op.IsRunning()) {
-      study::Report(progress, op.GetProgress(), doing);
-      std::this_thread::sleep_for(kPoll);
-    }
-  } catch (...) {
-    op.Stop();
-    WaitForEnd(op);
-    throw;
-  }
-}
-
-/// The operator walks the volume in 16.16 fixed point; beyond its range it would wrap around and
-/// show the volume again.
-void CheckReach(const study::Study& study, const study::PlaneGeometry& plane, double thickness) {
-  using study::ToVec3;
-  const study::Vec3 depth = study::Normalised(ToVec3(plane.coordinates.axisZ)) * (0.5 * thickness);
-  for (int corner = 0; corner < 8; ++corner) {
-    const study::Vec3 point = ToVec3(plane.coordinates.origin) +
-                              ToVec3(plane.coordinates.axisX) * ((corner & 1) * plane.width) +
-                              ToVec3(plane.coordinates.axisY) * ((corner >> 1 & 1) * plane.height) +
-                              depth * ((corner & 4) != 0 ? 1.0 : -1.0);
-    const study::Vec3 voxel = study::VoxelFromWorld(study, point);
-    if (std::max({std::abs(voxel.x), std::abs(voxel.y), std::abs(voxel.z)}) >
-        study::kLargestVolumeSide) {
-      throw study::Error("the plane reaches more than " +
-                         std::to_string(study::kLargestVolumeSide) + " voxels away");
-    }
-  }
-}
-
-std::unique_ptr<study::Study> EmptyCut(const study::Study& study, int width, int height) {
-  auto cut = std::make_unique<study::Study>();
-  study::AppendSlice(*cut, width, height);
-  cut->scale = study.scale;
-  cut->offset = study.offset;
-  cut->unit = study.unit;
-  cut->modality = study.modality;
-  cut->description = study.description;
-  return cut;
-}
 
 bool Overlap(const study::Extent& a, const study::Extent& b) {
   return a.minimum < b.maximum && b.minimum < a.maximum;
@@ -91,7 +28,7 @@ std::unique_ptr<study::Study> CutPlane(study::Study& study, const CutRequest& re
                                        const study::Progress& progress) {
   const study::PlaneGeometry plane = study::MakePlane(study, request.plane);
   CheckReach(study, plane, request.plane.thickness);
-  auto cut = EmptyCut(study, plane.width, plane.height);
+  auto cut = MakeCut(study, plane.width, plane.height);
   dSlice& slice = *cut->volume.GetSlice(0);
   slice.SetCoordinates(request.linear ? study::ForTrilinear(study, plane.coordinates)
                                       : plane.coordinates);
@@ -105,9 +42,7 @@ std::unique_ptr<study::Study> CutPlane(study::Study& study, const CutRequest& re
   RunWatched(op, progress, "cutting the plane");
   CheckStatus(op, "cut the plane");
 
-  const dCoordSys3D& place = plane.coordinates;
-  study::PlaceVolume(*cut, study::ToVec3(place.origin), study::ToVec3(place.axisX),
-                     study::ToVec3(place.axisY), study::ToVec3(place.axisZ));
+  PlaceCut(*cut, plane.coordinates);
   study::Report(progress, 1, "cutting the plane");
   return cut;
 }

@@ -6,6 +6,7 @@
 #include <array>
 #include <cmath>
 #include <cstdint>
+#include <numeric>
 #include <vector>
 
 namespace cli {
@@ -26,6 +27,8 @@ constexpr std::array<Preset, 7> kPresets{{{"bone", {500, 2000}},
 
 constexpr double kStoredValues = 65536;
 constexpr double kAutoTail = 0.005;
+constexpr double kProjectionTail = 1e-4;
+constexpr double kProjectionHeadroom = 1.1;
 
 /// Where a window is moved that lies too high: far enough up that its lower edge, up to 32768
 /// below, stays above 0. Samples that saturate at 0 are below it then, as they should be. (A window
@@ -42,6 +45,10 @@ Histogram HistogramOf(const study::Study& study) {
     }
   }
   return counts;
+}
+
+double VoxelCount(const study::Study& study) {
+  return 1.0 * study.volume.GetSizeX() * study.volume.GetSizeY() * study.volume.GetSizeZ();
 }
 
 /// The first value, in the order of the iterators, at which more than `tail` samples have passed.
@@ -97,13 +104,46 @@ std::string PresetList() {
 
 RealWindow AutoWindow(study::Study& study) {
   const Histogram counts = HistogramOf(study);
-  const double tail =
-      kAutoTail * study.volume.GetSizeX() * study.volume.GetSizeY() * study.volume.GetSizeZ();
+  const double tail = kAutoTail * VoxelCount(study);
   const auto lowest = static_cast<double>(PassTail(counts.begin(), counts.end(), tail));
   const double highest =
       kStoredValues - 1 - static_cast<double>(PassTail(counts.rbegin(), counts.rend(), tail));
   const double width = std::max(highest - lowest, 2.0);
   return {study.RealValue(0.5 * (lowest + highest)), width * study.scale};
+}
+
+RealWindow ProjectionWindow(study::Study& study) {
+  const Histogram counts = HistogramOf(study);
+  const double voxels = VoxelCount(study);
+  const auto fromTop = [&](double tail) {
+    return kStoredValues - 1 -
+           static_cast<double>(PassTail(counts.rbegin(), counts.rend(), tail * voxels));
+  };
+  const auto darkest =
+      static_cast<double>(PassTail(counts.begin(), counts.end(), kAutoTail * voxels));
+  const auto middle = counts.begin() + std::lround(0.5 * (darkest + fromTop(kAutoTail)));
+  const double bright = std::accumulate(middle, counts.end(), 0.0);
+  const double black = static_cast<double>(middle - counts.begin()) +
+                       static_cast<double>(PassTail(middle, counts.end(), 0.5 * bright));
+  const double width = std::max((fromTop(kProjectionTail) - black) * kProjectionHeadroom, 2.0);
+  return {study.RealValue(black + 0.5 * width), width * study.scale};
+}
+
+std::optional<RealWindow> DrawnWindow(const study::Study& picture) {
+  Histogram counts = HistogramOf(picture);
+  counts.front() = 0;
+  const double drawn = std::accumulate(counts.begin(), counts.end(), 0.0);
+  if (drawn == 0) {
+    return std::nullopt;
+  }
+  const auto lowest =
+      static_cast<double>(PassTail(counts.begin(), counts.end(), kAutoTail * drawn));
+  const double highest =
+      kStoredValues - 1 -
+      static_cast<double>(PassTail(counts.rbegin(), counts.rend(), kAutoTail * drawn));
+  // The darkest third of the levels is left to the black around.
+  const double width = std::max(1.5 * (highest - lowest), 2.0);
+  return RealWindow{picture.RealValue(highest - 0.5 * width), width * picture.scale};
 }
 
 RealWindow ResolveWindow(const WindowChoice& choice, study::Study& study) {

@@ -38,6 +38,16 @@ RealWindow ResolveWindow(const WindowChoice& choice, study::Study& study);
 /// above; a volume of one value gets a window around it.
 RealWindow AutoWindow(study::Study& study);
 
+/// The same for pictures of the brightest voxels, in which nearly every ray meets soft tissue:
+/// black up to the middle value of all that is not background, white a tenth above the value that
+/// one voxel in 10,000 lies above. What is bright in a few places only, such as bones, stands out;
+/// a few specks of metal do not make the rest dark.
+RealWindow ProjectionWindow(study::Study& study);
+
+/// For a picture of single things on black (samples of 0): what is drawn reaches from dark grey to
+/// white, half a percent at both ends aside. Empty when nothing is drawn.
+std::optional<RealWindow> DrawnWindow(const study::Study& picture);
+
 /// How a window in real values is shown through the library's table of stored values.
 ///
 /// The table holds the centre within 0 to 65536 and the width within 2 to 65536. A window that fits

@@ -1,46 +1,38 @@
 #include <study/Error.h>
 #include <study/OutputFile.h>
 #include <study/Pictures.h>
-#include <vorl/Data/dImaDescriptorDIB.h>
+#include <vorl/Data/dDIB.h>
+#include <vorl/IO/File/opDIB2Ima.h>
 
 #include <algorithm>
 #include <cctype>
-#include <cstring>
 #include <string>
 
 namespace study {
-namespace {
 
-/// A copy whose rows are as long as bitmap files want them.
-void CopyAligned(const dImage& image, dImage& copy) {
-  if (!copy.Init(image.GetWidth(), image.GetHeight(), image.GetDataType(),
-                 image.GetChannelSequence(), image.GetDataOrder(), 4) ||
-      !copy.Fill(0)) {
-    throw Error("no memory for the picture");
-  }
-  const unsigned long bytes = std::min(image.GetBytesPerRow(), copy.GetBytesPerRow());
-  for (int y = 0; y < static_cast<int>(image.GetHeight()); ++y) {
-    std::memcpy(copy.GetRowPtr(y), image.GetRowPtr(y), bytes);
-  }
-}
-
-}  // namespace
-
-void SaveBmp(const dImage& image, const std::filesystem::path& path) {
-  if (!image.IsValid() || image.GetDataType() != ImageDataType_U8) {
-    throw Error("only images of 8 bits can be written as BMP");
+void SaveBmp(const dImage& image, const std::filesystem::path& path, bool ascending) {
+  const bool hasLayout =
+      image.GetDataType() == ImageDataType_U8 || image.GetDataType() == ImageDataType_U1;
+  if (!image.IsValid() || !hasLayout) {
+    throw Error("only images of 1 or 8 bits can be written as BMP");
   }
   OutputFile output(path);
-  dImage aligned;
-  CopyAligned(image, aligned);
-  dImaDescriptorDIB descriptor;
-  const bool written = descriptor.Init(aligned) != nullptr &&
-                       descriptor.Save(output.TemporaryPath().string().c_str(), true);
-  if (!written) {
+  dDIB bitmap;
+  bitmap = image;
+  bitmap.ResetPalette(ascending);
+  if (!bitmap.IsValid() || !bitmap.Save(output.TemporaryPath().string().c_str(), true)) {
     throw Error("can't write " + Quoted(path.string()) + ": " +
-                static_cast<const char*>(descriptor.GetStatus()));
+                static_cast<const char*>(bitmap.GetStatus()));
   }
   output.Commit();
+}
+
+void LoadBmp(const std::filesystem::path& path, dImage& image) {
+  opDIB2Ima reader;
+  if (!reader.Convert(path.string().c_str(), image)) {
+    throw Error("can't read " + Quoted(path.string()) + ": " +
+                static_cast<const char*>(reader.GetStatus()));
+  }
 }
 
 void SavePicture(const dImage& image, const std::filesystem::path& path) {

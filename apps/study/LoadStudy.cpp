@@ -43,6 +43,10 @@ std::unique_ptr<Study> LoadStudy(const std::vector<fs::path>& paths, const std::
     if (!fs::exists(path, ignored)) {
       throw Error(Quoted(path.string()) + " does not exist");
     }
+    // Opening a pipe would wait for somebody who writes into it.
+    if (!fs::is_regular_file(path, ignored) && !fs::is_directory(path, ignored)) {
+      throw Error(Quoted(path.string()) + " is neither a file nor a folder");
+    }
     if (!IsMeantAsStudyFile(path)) {
       continue;
     }

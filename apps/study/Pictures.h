@@ -2,7 +2,7 @@
 #define VORL_APPS_STUDY_PICTURES_H
 
 /// @file
-/// Saving images as picture files.
+/// Images as picture files.
 
 #include <vorl/Data/dImage.h>
 
@@ -21,7 +21,15 @@ void SavePicture(const dImage& image, const std::filesystem::path& path);
 
 /// The same with the kind chosen by name rather than by extension.
 void SavePng(const dImage& image, const std::filesystem::path& path);
-void SaveBmp(const dImage& image, const std::filesystem::path& path);
+/// BMP also takes images of 1 bit, and "BGRA". `ascending`: the colour table of grey images runs from
+/// black to white, else from white to black.
+void SaveBmp(const dImage& image, const std::filesystem::path& path, bool ascending = true);
+
+/// Reads a PNG of up to 8 bits per sample: grey, "BGR", or "BGRA" where something is transparent.
+/// Colour spaces are left out of account. Throws `Error` ("can't read 'name': ...").
+void LoadPng(const std::filesystem::path& path, dImage& image);
+/// Reads a BMP (see `opDIB2Ima`). Throws `Error` ("can't read 'name': ...").
+void LoadBmp(const std::filesystem::path& path, dImage& image);
 
 }  // namespace study
 

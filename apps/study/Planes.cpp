@@ -47,6 +47,7 @@ Frame FrameOf(const PlaneRequest& request) {
   Turn(frame, frame.right, request.turnAboutRight);
   Turn(frame, frame.down, request.turnAboutDown);
   Turn(frame, frame.normal, request.turnAboutNormal);
+  Turn(frame, {0, 0, 1}, request.turnAboutBodyAxis);
   return frame;
 }
 
@@ -62,7 +63,7 @@ bool IsLength(double value) {
 
 void CheckRequest(const PlaneRequest& request) {
   Require(std::isfinite(request.turnAboutRight) && std::isfinite(request.turnAboutDown) &&
-              std::isfinite(request.turnAboutNormal),
+              std::isfinite(request.turnAboutNormal) && std::isfinite(request.turnAboutBodyAxis),
           "the angles of the plane are not finite");
   Require(!request.centre || (IsFinite(*request.centre) && Length(*request.centre) <= kLongestMm),
           "the centre of the plane is not within a kilometre");

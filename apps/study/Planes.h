@@ -29,6 +29,9 @@ struct PlaneRequest {
   double turnAboutRight = 0;
   double turnAboutDown = 0;
   double turnAboutNormal = 0;
+  /// Then turns it about the patient's own axis from feet to head, as if the patient stood on a
+  /// turntable: 90 degrees take the view from the front to the one from the patient's left.
+  double turnAboutBodyAxis = 0;
   /// Pixels; 0: as many as show the whole volume. A size that is given is centred on `centre`.
   int width = 0;
   int height = 0;

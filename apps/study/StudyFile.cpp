@@ -1,12 +1,10 @@
+#include <study/FileItems.h>
 #include <study/OutputFile.h>
 #include <study/StudyFile.h>
 #include <vorl/IO/BinaryDataIO.h>
 
-#include <array>
-#include <cmath>
 #include <cstring>
 #include <fstream>
-#include <limits>
 
 namespace study {
 namespace {
@@ -16,37 +14,6 @@ namespace fs = std::filesystem;
 constexpr char kTypeName[] = "vorlStudy";
 constexpr char kEndMark[] = "end";
 constexpr std::uint32_t kVersion = 1;
-constexpr std::size_t kLongestText = 4096;
-
-using CoordinateArray = std::array<float, 12>;
-
-CoordinateArray ToArray(const dCoordSys3D& c) {
-  return {c.origin.x, c.origin.y, c.origin.z, c.axisX.x, c.axisX.y, c.axisX.z,
-          c.axisY.x,  c.axisY.y,  c.axisY.z,  c.axisZ.x, c.axisZ.y, c.axisZ.z};
-}
-
-dCoordSys3D FromArray(const CoordinateArray& a) {
-  return {dVect3D(a[0], a[1], a[2]), dVect3D(a[3], a[4], a[5]), dVect3D(a[6], a[7], a[8]),
-          dVect3D(a[9], a[10], a[11])};
-}
-
-std::string WhatWentWrong(const dStatus& status) {
-  switch (static_cast<long>(status)) {
-    case -3:
-      return "the file can't be opened";
-    case -100:
-      return "the disk is full, or the writing failed";
-    case -200:
-    case -201:
-      return "the file ends too early or is damaged";
-    case -202:
-      return "it is a binary data file, but holds no study";
-    case -203:
-      return "it is no binary data file";
-    default:
-      return std::string("the file is damaged (") + static_cast<const char*>(status) + ")";
-  }
-}
 
 // ---------------------------------------------------------------------------------- writing
 
@@ -59,15 +26,13 @@ void WriteHeader(BinaryDataOut& out, Study& study) {
   out.WriteString(study.description);
   out.WriteF64(study.windowCentre);
   out.WriteF64(study.windowWidth);
-  const CoordinateArray coordinates = ToArray(study.volume.GetCoordinates());
-  out.WriteF32Array(coordinates.data(), static_cast<int>(coordinates.size()));
+  WriteCoordinates(out, study.volume.GetCoordinates());
   out.WriteU32(static_cast<unsigned long>(study.volume.GetSliceCount()));
 }
 
 void WriteSlice(BinaryDataOut& out, dSlice& slice, unsigned long index) {
   out.OpenBlock(index);
-  const CoordinateArray coordinates = ToArray(slice.GetCoordinates());
-  out.WriteF32Array(coordinates.data(), static_cast<int>(coordinates.size()));
+  WriteCoordinates(out, slice.GetCoordinates());
   out.Write(&slice.GetImage());
   out.CloseBlock();
 }
@@ -89,42 +54,6 @@ void WriteAll(Study& study, const char* fileName, const Progress& progress) {
 }
 
 // ---------------------------------------------------------------------------------- reading
-
-void Require(bool holds, const char* what) {
-  if (!holds) {
-    throw Error(what);
-  }
-}
-
-double ReadFinite(BinaryDataIn& in) {
-  double value = 0;
-  in.ReadF64(value);
-  Require(std::isfinite(value), "a number in it is not finite");
-  return value;
-}
-
-/// A text without the zero byte that the format keeps behind it.
-std::string ReadText(BinaryDataIn& in) {
-  const unsigned long size = in.ReadArrayLength();
-  Require(size >= 1 && size <= kLongestText, "a text in it has an impossible length");
-  std::string text(size, '\0');
-  in.ReadU8Array(reinterpret_cast<unsigned char*>(text.data()), static_cast<int>(size));
-  Require(text.find('\0') == size - 1, "a text in it is not ended by a zero byte");
-  text.pop_back();
-  return text;
-}
-
-dCoordSys3D ReadCoordinates(BinaryDataIn& in) {
-  CoordinateArray numbers{};
-  Require(in.ReadArrayLength() == numbers.size(), "its coordinates are not twelve numbers");
-  in.ReadF32Array(numbers.data(), static_cast<int>(numbers.size()));
-  const dCoordSys3D coordinates = FromArray(numbers);
-  const std::string problem = PlacementProblem(coordinates);
-  if (!problem.empty()) {
-    throw Error(problem);
-  }
-  return coordinates;
-}
 
 int ReadHeader(BinaryDataIn& in, Study& study) {
   std::uint32_t version = 0;
@@ -185,23 +114,17 @@ void ReadAll(Study& study, const char* fileName, const Progress& progress) {
 
 // -------------------------------------------------------------------------------- verifying
 
-bool SameBits(const dCoordSys3D& a, const dCoordSys3D& b) {
-  const CoordinateArray first = ToArray(a);
-  const CoordinateArray second = ToArray(b);
-  return std::memcmp(first.data(), second.data(), sizeof first) == 0;
-}
-
 bool SameBits(const Study& a, const Study& b) {
   return a.scale == b.scale && a.offset == b.offset && a.unit == b.unit &&
          a.modality == b.modality && a.description == b.description &&
          a.windowCentre == b.windowCentre && a.windowWidth == b.windowWidth &&
-         SameBits(a.volume.GetCoordinates(), b.volume.GetCoordinates());
+         study::SameBits(a.volume.GetCoordinates(), b.volume.GetCoordinates());
 }
 
 bool SameBits(const dSlice& a, const dSlice& b) {
   const auto first = SamplesOf(a);
   const auto second = SamplesOf(b);
-  return SameBits(a.GetCoordinates(), b.GetCoordinates()) && a.GetWidth() == b.GetWidth() &&
+  return study::SameBits(a.GetCoordinates(), b.GetCoordinates()) && a.GetWidth() == b.GetWidth() &&
          first.size() == second.size() &&
          std::memcmp(first.data(), second.data(), first.size_bytes()) == 0;
 }
@@ -253,7 +176,7 @@ void WriteStudyFile(Study& study, const fs::path& path, const Progress& progress
     Verify(study, name.c_str(), PartOf(progress, 0.7, 1));
     Report(progress, 1, "written");
   } catch (const dStatus& status) {
-    throw fail(WhatWentWrong(status));
+    throw fail(WhatWentWrong(status, "study"));
   } catch (const Cancelled&) {
     throw;
   } catch (const Error& error) {
@@ -270,7 +193,7 @@ std::unique_ptr<Study> ReadStudyFile(const fs::path& path, const Progress& progr
   try {
     ReadAll(*study, path.string().c_str(), progress);
   } catch (const dStatus& status) {
-    throw fail(WhatWentWrong(status));
+    throw fail(WhatWentWrong(status, "study"));
   } catch (const Cancelled&) {
     throw;
   } catch (const Error& error) {

@@ -1,8 +1,10 @@
 // What becomes of images, volumes and operators when there is no memory left.
 #include <gtest/gtest.h>
 #include <tests/Support/Allocation.h>
-#include <vorl/Data/dImaDescriptorDIB.h>
+#include <vorl/Data/dDIB.h>
 #include <vorl/Data/dVolume.h>
+#include <vorl/GUI/vIma2Device.h>
+#include <vorl/IO/File/opDIB2Ima.h>
 #include <vorl/Operators/IP/opMPR.h>
 
 #include <string>
@@ -89,6 +91,55 @@ TEST(DataOutOfMemory, BitmapCannotBeDescribed) {
     EXPECT_TRUE(descriptor.GetStatus() == -1);
     EXPECT_FALSE(dImaDescriptorDIB(good).IsValid());
   }
+}
+
+TEST(DataOutOfMemory, SectionCannotBeCreated) {
+  dDIB dib(4, 4, 1, 8);
+  {
+    const AllocationFailure failure;
+    EXPECT_FALSE(dib.Init(8, 8, 3, 8));
+    EXPECT_FALSE(dib.Init(8UL, 8UL, ImageDataType_U8, kLongSequence.c_str(), 0, 4));
+    EXPECT_EQ(dDIB::Create(), nullptr);
+  }
+  EXPECT_FALSE(dib.IsValid());
+  EXPECT_EQ(dib.GetHandle(), nullptr);
+  EXPECT_TRUE(dib.GetStatus() == -1);
+  EXPECT_TRUE(dib.Init(8, 8, 3, 8));
+}
+
+TEST(DataOutOfMemory, BitmapThatCannotBeDescribedIsNotTaken) {
+  dDIB source(4, 4, 1, 8);
+  dDIB target;
+  dImage image;
+  {
+    const AllocationFailure failure;
+    target <<= source;
+    EXPECT_FALSE(target.Init(DTM_Reference, source));
+    EXPECT_FALSE(dDIB(source).IsValid());
+  }
+  EXPECT_TRUE(source.IsValid());
+  EXPECT_NE(source.GetHandle(), nullptr);
+  EXPECT_FALSE(target.IsValid());
+  EXPECT_EQ(target.GetHandle(), nullptr);
+}
+
+TEST(DataOutOfMemory, BitmapIsNeitherImportedNorDrawn) {
+  dImage image;
+  ASSERT_TRUE(image.Init(4, 4, ImageDataType_U8, "BGR", 0, 4));
+  const tagBITMAPINFO info{{40, 4, 4, 1, 24, 0, 0, 0, 0, 0, 0}, {}};
+  const unsigned char bits[48] = {};
+  dDIB dib;
+  opDIB2Ima op;
+  vIma2Device renderer;
+  {
+    const AllocationFailure failure;
+    EXPECT_FALSE(op.Convert(&info, bits, dib));
+    EXPECT_FALSE(renderer.Init(&image, nullptr, nullptr, false, false));
+  }
+  EXPECT_TRUE(op.GetStatus() == -1);
+  EXPECT_FALSE(dib.IsValid());
+  EXPECT_TRUE(renderer.GetStatus() == -1);
+  EXPECT_FALSE(renderer.IsInitialized());
 }
 
 TEST(DataOutOfMemory, OperatorFails) {

@@ -2,31 +2,19 @@
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <string>
 #include <vector>
 
 #include "../Support/LogRecorder.h"
+#include "TextFile.h"
 
 namespace {
 
 namespace fs = std::filesystem;
 
-class dASCIIStreamFile : public testing::Test {
- protected:
-  void SetUp() override {
-    std::string name = testing::UnitTest::GetInstance()->current_test_info()->name();
-    std::replace(name.begin(), name.end(), '/', '_');
-    m_path = (fs::path(testing::TempDir()) / ("vorl_ascii_" + name)).string();
-    Write("0123456789");
-  }
-  void TearDown() override { fs::remove_all(m_path); }
-  void Write(const std::string& text) { std::ofstream(m_path, std::ios::binary) << text; }
-
-  std::string m_path;
-};
+class dASCIIStreamFile : public TextFile {};
 
 /// Everything that NextChar gives, and the character of its failure.
 std::string ReadAll(dASCIIStreamIn& stream, char& last) {
@@ -165,22 +153,6 @@ TEST_F(dASCIIStreamFile, FolderCannotBeOpened) {
             std::vector<std::string>{"dASCIIStreamIn::Init: can't to open '" + folder + "'"});
   EXPECT_FALSE(stream.IsValid());
 }
-
-#if !defined(_WIN32)
-TEST_F(dASCIIStreamFile, FileWithoutReadPermissionIsNamed) {
-  fs::permissions(m_path, fs::perms::none);
-  if (std::ifstream(m_path).is_open()) {
-    GTEST_SKIP() << "this user may read every file";
-  }
-  LogRecorder log;
-  dASCIIStreamIn stream;
-  EXPECT_FALSE(stream.Init(m_path.c_str(), 4));
-  EXPECT_STREQ(stream.GetStatus(), ("no read permission for '" + m_path + "'").c_str());
-  EXPECT_EQ(log.errors, std::vector<std::string>{"dASCIIStreamIn::CheckFile: no read permission "
-                                                 "for '" +
-                                                 m_path + "'"});
-}
-#endif
 
 TEST_F(dASCIIStreamFile, EmptyFileHasNothingToRead) {
   Write("");

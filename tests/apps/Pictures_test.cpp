@@ -134,7 +134,7 @@ TEST(SavePicture, RefusesOtherNamesAndImages) {
   EXPECT_EQ(ErrorOf([&] { SavePng(dImage(), folder / "a.png"); }), notPng);
   const dImage wide = CountingImage(2, 2, ImageDataType_U16, "G", 1);
   EXPECT_EQ(ErrorOf([&] { SaveBmp(wide, folder / "a.bmp"); }),
-            "only images of 8 bits can be written as BMP");
+            "only images of 1 or 8 bits can be written as BMP");
   EXPECT_THAT(folder.Names(), IsEmpty());
 }
 

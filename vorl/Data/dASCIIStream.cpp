@@ -15,6 +15,7 @@
 
 #include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Platform/detail/File.h>
 
 inline namespace vorl {
 
@@ -39,11 +40,7 @@ bool Exists(const char* fileName) {
 }
 
 std::shared_ptr<std::FILE> OpenFile(const char* fileName) {
-  std::error_code error;
-  if (fs::is_directory(fileName, error)) {
-    return nullptr;  // some systems open it and only refuse to read
-  }
-  std::FILE* file = std::fopen(fileName, "rb");
+  std::FILE* file = vorl_detail::OpenFileForReading(fileName);
   if (file == nullptr) {
     return nullptr;
   }
@@ -65,7 +62,10 @@ std::size_t ReadAt(std::FILE* file, std::uint64_t position, char* out, std::size
 }
 
 std::shared_ptr<char[]> AllocateBuffer(unsigned long size) {
-  if (size > std::numeric_limits<std::uint32_t>::max()) {
+  constexpr std::uint64_t kMostBytes =
+      std::min<std::uint64_t>(std::numeric_limits<std::uint32_t>::max(),
+                              std::numeric_limits<std::size_t>::max() - kBufferSlack);
+  if (size > kMostBytes) {
     return nullptr;
   }
   char* buffer = new (std::nothrow) char[std::size_t{size} + kBufferSlack];
@@ -173,6 +173,10 @@ bool dASCIIStreamIn::CheckFile(const char* fileName) {
 }
 
 bool dASCIIStreamIn::FillBuffer(unsigned long position) {
+  return FillFrom(position);
+}
+
+bool dASCIIStreamIn::FillFrom(std::uint64_t position) {
   LogContext context("dASCIIStreamIn::FillBuffer", __FILE__, __LINE__, true);
   if (m_buffer == nullptr) {
     m_status.Set(false, "FillBuffer(): buffer not initialized");
@@ -194,24 +198,41 @@ bool dASCIIStreamIn::FillBuffer(unsigned long position) {
 }
 
 bool dASCIIStreamIn::FillBuffer(unsigned long position, char* ch) {
-  if (!FillBuffer(position)) {
-    *ch = '\0';
-    return false;
-  }
-  *ch = *m_current++;
-  return true;
+  return FillFrom(position) ? Take(ch) : TakeNothing(ch);
 }
 
 bool dASCIIStreamIn::NextChar(char* ch) {
-  // A string has no end here: it does not serve reading character by character.
-  if (m_bufferEnd == nullptr || m_current == m_bufferEnd) {
-    return FillBuffer(static_cast<unsigned long>(m_bufferOffset + m_bufferFill), ch);
+  if (ch == nullptr) {
+    LogContext context("dASCIIStreamIn::NextChar", __FILE__, __LINE__, true);
+    m_status.Set(false, "invalid parameter");
+    context.Status(__LINE__, m_status);
+    return false;
   }
-  *ch = *m_current++;
+  // A string has no end here: it does not serve reading character by character.
+  const bool mustFill = m_bufferEnd == nullptr || m_current == m_bufferEnd;
+  // The next stretch may begin behind what a position of the interface can say.
+  return !mustFill || FillFrom(m_bufferOffset + m_bufferFill) ? Take(ch) : TakeNothing(ch);
+}
+
+bool dASCIIStreamIn::Take(char* ch) {
+  const char next = *m_current++;
+  if (ch != nullptr) {
+    *ch = next;
+  }
   return true;
 }
 
+bool dASCIIStreamIn::TakeNothing(char* ch) {
+  if (ch != nullptr) {
+    *ch = '\0';
+  }
+  return false;
+}
+
 bool dASCIIStreamIn::GetChar(char* ch) const {
+  if (ch == nullptr) {
+    return false;
+  }
   if (m_current == nullptr) {
     *ch = '\0';
     return false;
@@ -234,6 +255,11 @@ bool dASCIIStreamIn::SetPos(unsigned long position) {
 
 bool dASCIIStreamIn::GetString(unsigned long position, unsigned long length, char* out) {
   LogContext context("dASCIIStreamIn::GetString", __FILE__, __LINE__, true);
+  if (out == nullptr) {
+    m_status.Set(false, "invalid parameter");
+    context.Status(__LINE__, m_status);
+    return false;
+  }
   // What ends exactly at the buffer's end is read from the file.
   if (Holds(position) && length < m_bufferFill - (position - m_bufferOffset)) {
     std::memcpy(out, m_buffer + (position - m_bufferOffset), length);

@@ -53,16 +53,24 @@ class VORL_API dASCIIStreamIn : public BaseClass {
   /// for an empty file.
   bool Init(const char* fileName, unsigned long bufferSize);
 
-  /// Takes the next character. False, with a zero character, at the end of the file.
+  /// Takes the next character. False, with a zero character, at the end of the file, over a string
+  /// ("FillBuffer(): source isn't a file") and with nothing to read ("FillBuffer(): buffer not
+  /// initialized"); false for a null pointer ("invalid parameter").
   bool NextChar(char* ch);
-  /// Looks at the character at the current position. False, with a zero character, before anything
-  /// was read; behind the last character it is a zero character.
+  /// Looks at the character at the current position. False, with a zero character, when there is no
+  /// position yet; false for a null pointer.
+  ///
+  /// The read buffer is not filled anew: once the last character in it has been taken, this is a
+  /// zero character, until `NextChar` or `SetPos` reads on.
   bool GetChar(char* ch) const;
-  /// Moves to a position in the file, or in the string.
+  /// Moves to a position in the file, or in the string. A position outside the read buffer fills it
+  /// from there; false when nothing is there. Over a string: "FillBuffer(): source isn't a file";
+  /// with nothing to read: "FillBuffer(): buffer not initialized".
   bool SetPos(unsigned long position);
   /// Copies `length` characters from a position on and terminates them: `out` has room for one more
   /// than `length`. False when there are fewer, which a file then gives as far as they go; a string
-  /// gives none and sets "GetString() invalid string pos: %d(length %d)".
+  /// gives none and sets "GetString() invalid string pos: %d(length %d)". False for a null pointer
+  /// ("invalid parameter"). The current position stays.
   bool GetString(unsigned long position, unsigned long length, char* out);
 
   const dStatus& GetStatus() const;
@@ -71,7 +79,8 @@ class VORL_API dASCIIStreamIn : public BaseClass {
   /// Fills the read buffer from a position of the file on; false when nothing is there. Fails with
   /// "FillBuffer(): buffer not initialized" or "FillBuffer(): source isn't a file".
   bool FillBuffer(unsigned long position);
-  /// The same, and takes the first character; a zero character when it fails.
+  /// The same, and takes the first character; a zero character when it fails. A null pointer takes
+  /// the character without handing it out.
   bool FillBuffer(unsigned long position, char* ch);
   /// Fails with "given file name is 'NULL' or empty", "no such file: '%s'" or
   /// "no read permission for '%s'".
@@ -79,6 +88,9 @@ class VORL_API dASCIIStreamIn : public BaseClass {
 
  private:
   bool Holds(unsigned long position) const;
+  bool FillFrom(std::uint64_t position);
+  bool Take(char* ch);
+  bool TakeNothing(char* ch);
 
   dStatus m_status;
   std::shared_ptr<std::FILE> m_file;

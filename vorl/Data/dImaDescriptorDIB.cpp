@@ -212,11 +212,13 @@ std::uint64_t dImaDescriptorDIB::FileRowBytes() const {
   return vorl_detail::BitmapRowBytes(m_imageWidth, m_block.front().bmiHeader.biBitCount);
 }
 
-// The caller may have formatted the image anew since, or written into the block: what is saved must
-// lie inside the pixels.
-bool dImaDescriptorDIB::DescribesImage() const {
-  return !m_block.empty() && m_pImage->GetDataPtr() == m_pixelData &&
-         m_pImage->GetWidth() == m_imageWidth && FileRowBytes() <= MemoryRowBytes() &&
+// The caller may have formatted the image anew since, or written into the block: what is saved or
+// drawn must lie inside the pixels.
+bool dImaDescriptorDIB::IsCurrent() const {
+  return !m_block.empty() && m_pixelData != nullptr && m_pImage->GetDataPtr() == m_pixelData &&
+         m_pImage->GetWidth() == m_imageWidth && m_pImage->GetHeight() == RowCount() &&
+         m_pImage->GetColumnOffset() == m_block.front().bmiHeader.biBitCount &&
+         m_pImage->GetBytesPerRow() == MemoryRowBytes() && FileRowBytes() <= MemoryRowBytes() &&
          MemoryRowBytes() * RowCount() <= m_pImage->GetImageSize();
 }
 
@@ -227,7 +229,7 @@ bool dImaDescriptorDIB::Save(const char* filePath, bool overwrite) {
     context.Status(line, m_status);
     return false;
   };
-  if (!DescribesImage()) {
+  if (!IsCurrent()) {
     return fail(__LINE__, "dImaDescriptorDIB: not initialized", "");
   }
   if (filePath == nullptr || *filePath == '\0') {

@@ -61,6 +61,9 @@ class VORL_API dImaDescriptorDIB : public DataBase {
   tagBITMAPINFO* Init(dImage& image);
   /// The information block; null without an image. Valid until the next `Init` or `Reset`.
   tagBITMAPINFO* GetHeader() const;
+  /// True while the block describes the image as it is now: false without an image, and when the
+  /// image has been formatted anew since.
+  bool IsCurrent() const;
   /// The first pixel byte of the image; null without an image.
   void* GetPixelData() const;
   /// The number of colour-table entries: 2, 256 or 0.
@@ -91,7 +94,6 @@ class VORL_API dImaDescriptorDIB : public DataBase {
   std::uint64_t RowCount() const;
   std::uint64_t MemoryRowBytes() const;
   std::uint64_t FileRowBytes() const;
-  bool DescribesImage() const;
   bool WriteFileHeader(vorl_detail::BitmapFile& file) const;
   bool WriteInfo(vorl_detail::BitmapFile& file) const;
   bool WriteRows(vorl_detail::BitmapFile& file) const;

@@ -1,5 +1,6 @@
 #include <vorl/Data/dImage.h>
 
+#include <algorithm>
 #include <cstring>
 #include <new>
 
@@ -176,6 +177,18 @@ bool dImage::ResetTo(const dImage& source) {
   return true;
 }
 
+// False, with the image reset, when there is no memory for a copy.
+bool dImage::TakePixels(dImage& source, DataTransferMode mode) {
+  const bool isCopy = mode == DTM_Copy || (mode == DTM_TakeOver && source.m_lendsPixels);
+  m_buffer.Init(source.m_buffer, isCopy ? DTM_Copy : mode);
+  if (isCopy && source.m_buffer && !m_buffer) {
+    Reset();
+    m_status.Set(false, "no memory(%lu bytes required)", source.GetImageSize());
+    return false;
+  }
+  return true;
+}
+
 bool dImage::Init(DataTransferMode mode, dImage& source) {
   LogContext context("dImage::Init", __FILE__, __LINE__, true);
   if (this == &source) {
@@ -184,10 +197,7 @@ bool dImage::Init(DataTransferMode mode, dImage& source) {
   if (!ResetTo(source)) {
     return Fail(context, __LINE__);
   }
-  m_buffer.Init(source.m_buffer, mode);
-  if (mode == DTM_Copy && source.IsValid() && !IsValid()) {
-    Reset();
-    m_status.Set(false, "no memory(%lu bytes required)", source.GetImageSize());
+  if (!TakePixels(source, mode)) {
     return Fail(context, __LINE__);
   }
   OnInit();
@@ -208,7 +218,11 @@ dImage& dImage::operator=(const dImage& source) {
   if (!source.IsValid()) {
     Reset();
   } else if (Init(source, 0, 0, 0)) {
-    m_buffer = source.m_buffer;
+    if (GetImageSize() == source.GetImageSize()) {
+      m_buffer = source.m_buffer;
+    } else {
+      CopyRows(source);
+    }
     m_status = source.m_status;
   }
   return *this;
@@ -218,16 +232,23 @@ void dImage::operator<<=(dImage& source) {
   if (this == &source) {
     return;
   }
-  if (!ResetTo(source)) {
+  if (!ResetTo(source) || !TakePixels(source, DTM_TakeOver)) {
     return;
   }
-  m_buffer.Init(source.m_buffer, DTM_TakeOver);
   OnInit();
   source.Reset();
 }
 
 void dImage::operator>>=(dImage& destination) {
   destination <<= *this;
+}
+
+void dImage::CopyRows(const dImage& source) {
+  const auto bytes = static_cast<std::size_t>(std::min(m_rowOffset, source.m_rowOffset));
+  const auto rows = static_cast<int>(std::min(GetNumRows(), source.GetNumRows()));
+  for (int y = 0; y < rows; ++y) {
+    std::memcpy(GetRowPtr(y), source.GetRowPtr(y), bytes);
+  }
 }
 
 bool dImage::Fill(char value) {

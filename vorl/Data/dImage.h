@@ -231,14 +231,20 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// Allocates the pixels. Null without a message for size 0; null with "no memory(%d bytes
   /// required)" when the size is not to be had.
   void* AllocateDataBuffer(unsigned long size);
+  /// Copies the pixels of an image of the same format, whose rows may be of another length.
+  void CopyRows(const dImage& source);
 
   dStatus m_status;
   dBuffer m_buffer;
+  /// Set by a derived class whose `Reset` ends the pixels that the buffer refers to: whoever is to
+  /// take them over gets a copy.
+  bool m_lendsPixels = false;
 
  private:
   bool ResetTo(const dImage& source);
   void SetLayout(const vorl_detail::ImageLayout& layout);
   void ReadItems(BinaryDataIn& in);
+  bool TakePixels(dImage& source, DataTransferMode mode);
   bool Fail(LogContext& context, int line);
 
   dRect m_rect;

@@ -11,18 +11,13 @@ inline namespace vorl {
 
 using vorl_detail::Difference;
 using vorl_detail::kNearZero;
+using vorl_detail::kRadPerDegree;
 using vorl_detail::NearZero;
 using vorl_detail::Quotient;
 using vorl_detail::ScaledAbout;
 using vorl_detail::Single;
 using vorl_detail::Sum;
 using vorl_detail::ZeroIfNear;
-
-namespace {
-
-constexpr double kRadPerDegree = 0.017453292519444445;  // 3.1415926535 / 180
-
-}  // namespace
 
 VORL_REGISTER_CLASS(dVect2D, DataBase);
 

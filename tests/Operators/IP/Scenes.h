@@ -68,7 +68,8 @@ inline void RandomAxes(dCoordSys3D& system, Random& random) {
       system.axisZ = RandomVector(random);
   }
   if (random.Between(0, 15) == 0) {
-    (random.Between(0, 1) != 0 ? system.axisX : system.axisZ) = dVect3D(0, 0, 0);
+    dVect3D* const axes[] = {&system.axisX, &system.axisY, &system.axisZ};
+    *axes[random.Between(0, 2)] = dVect3D(0, 0, 0);
   }
 }
 

@@ -47,12 +47,14 @@ TEST_P(VolumeOperatorThread, ProgressRisesFromZeroToOne) {
   const auto job = MakeJob(Amount::Small);
   ASSERT_TRUE(job->Op().RunAsThread(0));
   double last = 0.0;
-  while (job->Op().IsRunning()) {
+  const auto limit = std::chrono::steady_clock::now() + waiting::kPatience;
+  while (job->Op().IsRunning() && std::chrono::steady_clock::now() < limit) {
     const double now = job->Op().GetProgress();
     ASSERT_GE(now, last);
     ASSERT_LE(now, 1.0);
     last = now;
   }
+  ASSERT_FALSE(job->Op().IsRunning());
   EXPECT_EQ(job->Op().GetProgress(), 1.0);
 }
 

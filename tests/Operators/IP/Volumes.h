@@ -42,6 +42,16 @@ inline void MakeCounting(dVolume& volume, int width, int height, int count) {
   }
 }
 
+/// All bytes of all slices, padding included.
+inline Bytes BytesOf(const dVolume& volume) {
+  Bytes bytes;
+  for (const dSlice& slice : volume.GetSliceList()) {
+    const Bytes more = BytesOf(slice.GetImage());
+    bytes.insert(bytes.end(), more.begin(), more.end());
+  }
+  return bytes;
+}
+
 /// A slice of `width` x `height` pixels, unpadded, every byte of it marked.
 inline void MakeSlice(dSlice& slice, unsigned long width, unsigned long height,
                       unsigned short type = ImageDataType_U16) {

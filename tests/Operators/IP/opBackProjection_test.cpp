@@ -160,6 +160,21 @@ TEST(opBackProjection, PlanesWithoutAPlaceSeeNothing) {
   EXPECT_EQ(drawing.Pixels(), Unsigned{0});
 }
 
+// A ray of the smallest step reaches half a voxel back: that far behind the plane it begins.
+TEST(opBackProjection, RaysBegin32768StepsBehindThePlane) {
+  constexpr float kStep = 1.0F / 65536;
+  dVolume volume;
+  MakeColumn<std::uint16_t>(volume, ImageDataType_U16, {9, 5});
+  for (const auto& [steps, brightest] : {std::pair(32768, 9), {32769, 5}}) {
+    Drawing<std::uint16_t> drawing(1, 1);
+    drawing.plane.GetCoordinates().axisZ = dVect3D(0, 0, kStep);
+    // Half a step less is where the ray is counted from, cut to a whole one.
+    drawing.plane.SetPosition(dVect3D(0, 0, static_cast<float>(65536 + steps) * kStep));
+    drawing.DrawVolume(volume);
+    EXPECT_EQ(drawing.Pixels(), Unsigned{static_cast<std::uint16_t>(brightest)}) << steps;
+  }
+}
+
 // Positions at the ends of what 32 bits hold, and the smallest steps.
 TEST(opBackProjection, ExtremePlacesAreSurvived) {
   dVolume volume;

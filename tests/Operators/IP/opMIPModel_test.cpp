@@ -4,14 +4,10 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
-
-#include "Scenes.h"
-#include "VolumeModel.h"
+#include "PlaneCases.h"
 
 namespace {
 
-using rasters::GuardedMemory;
 using rasters::Random;
 using volume_model::Coverage;
 using volume_model::Grid;
@@ -19,9 +15,9 @@ using volume_model::Slab;
 using volume_model::Triple;
 
 template <class T>
-class Model {
+class MipModel {
  public:
-  Model(const dVolume& volume, bool trilinear, Coverage& coverage)
+  MipModel(const dVolume& volume, bool trilinear, Coverage& coverage)
       : m_voxels(volume, trilinear, coverage), m_coverage(coverage) {}
 
   std::vector<T> Run(const dSlice& slice, const dCoordSys3D& volume, int depthSteps) {
@@ -58,75 +54,24 @@ class Model {
   Coverage& m_coverage;
 };
 
-template <class T>
-class Case {
- public:
-  Case(unsigned short type, Random& random) {
-    static constexpr std::array<int, 8> kDepthSteps = {-1, -1, -1, 0, 1, 2, 5, 300};
-    rasters::MakeRandomVolume(m_volume, type, random);
-    m_memory.PutUnder(m_slice.GetImage(), {.width = rasters::RandomSize(random, 12),
-                                           .height = rasters::RandomSize(random, 9),
-                                           .type = type,
-                                           .alignment = rasters::RandomAlignment(random)});
-    rasters::PlacePlane(m_slice, m_volume, random);
-    m_op.volume = &m_volume;
-    m_op.mipSlice = &m_slice;
-    m_op.SelectAlgo(random.Between(201, 202));
-    m_op.SetDepthSteps(random.Pick(kDepthSteps));
-  }
-
-  testing::Message Text() const {
-    return testing::Message() << "algorithm " << m_op.algoID << ", depth steps " << m_op.depthSteps
-                              << ", " << rasters::TextOf(m_volume, m_slice);
-  }
-
-  void Check(Coverage& coverage) {
-    Model<T> model(m_volume, m_op.algoID == MIPAlgo_Trilinear, coverage);
-    const std::vector<T> expected = model.Run(m_slice, m_volume.GetCoordinates(), m_op.depthSteps);
-    ASSERT_TRUE(m_op.Run()) << rasters::MessageOf(m_op);
-    ASSERT_EQ(rasters::SamplesOf<T>(m_slice.GetImage()), expected);
-    m_memory.ExpectSurroundingsUntouched();
-  }
-
- private:
-  dVolume m_volume;
-  dSlice m_slice;
-  GuardedMemory m_memory;
-  opMIP m_op;
+struct Traits {
+  using Op = opMIP;
+  template <class T>
+  using Model = MipModel<T>;
+  static constexpr int kNearest = MIPAlgo_Nearest;
+  static constexpr int kTrilinear = MIPAlgo_Trilinear;
+  static constexpr std::array<int, 8> kDepthSteps = {-1, -1, -1, 0, 1, 2, 5, 300};
+  static void SetSlice(Op& op, dSlice& slice) { op.mipSlice = &slice; }
 };
 
-// Fails when the cases have not met what they are there for.
-void ExpectCoverage(const Coverage& coverage) {
-  EXPECT_GT(coverage.inside, 2000);
-  EXPECT_GT(coverage.outside, 2000);
-  EXPECT_GT(coverage.partlyInside, 200);
-  EXPECT_GT(coverage.wrapped, 200);
-  EXPECT_GT(coverage.floored, 200);
-  EXPECT_GT(coverage.cut, 20);
-  EXPECT_GT(coverage.onLastPlane, 200);
-}
-
-template <class T>
-void CheckCases(unsigned short type, std::uint32_t seed) {
-  Random random(seed);
-  Coverage coverage;
-  for (int i = 0; i < 1000; ++i) {
-    Case<T> testCase(type, random);
-    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase.Text());
-    testCase.Check(coverage);
-    if (testing::Test::HasFatalFailure()) {
-      return;
-    }
-  }
-  ExpectCoverage(coverage);
-}
-
 TEST(opMIPModel, UnsignedVolumesEqualTheModelBitForBit) {
-  CheckCases<std::uint16_t>(ImageDataType_U16, 21);
+  const Coverage coverage = plane_cases::CheckCases<Traits, std::uint16_t>(ImageDataType_U16, 21);
+  EXPECT_GT(coverage.cut, 20);
 }
 
 TEST(opMIPModel, SignedVolumesEqualTheModelBitForBit) {
-  CheckCases<std::int16_t>(ImageDataType_S16, 22);
+  const Coverage coverage = plane_cases::CheckCases<Traits, std::int16_t>(ImageDataType_S16, 22);
+  EXPECT_GT(coverage.cut, 20);
 }
 
 // Slabs that begin, lie and end exactly on the borders of voxels.
@@ -148,7 +93,7 @@ TEST(opMIPModel, SlabsOnVoxelBordersEqualTheModelBitForBit) {
         op.SelectAlgo(algo);
         op.SetDepthSteps(depthSteps);
         ASSERT_TRUE(op.Run());
-        Model<std::uint16_t> model(volume, algo == MIPAlgo_Trilinear, coverage);
+        MipModel<std::uint16_t> model(volume, algo == MIPAlgo_Trilinear, coverage);
         ASSERT_EQ(rasters::SamplesOf<std::uint16_t>(slice.GetImage()),
                   model.Run(slice, volume.GetCoordinates(), depthSteps))
             << "algorithm " << algo << ", depth steps " << depthSteps << ", z " << z;

@@ -4,85 +4,30 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
-
 #include "MprModel.h"
-#include "Scenes.h"
+#include "PlaneCases.h"
 
 namespace {
 
 using mpr_model::Coverage;
-using rasters::GuardedMemory;
 using rasters::Random;
 
-template <class T>
-class Case {
- public:
-  Case(unsigned short type, Random& random) {
-    static constexpr std::array<int, 8> kDepthSteps = {0, 0, -1, -1, 1, 2, 5, 300};
-    rasters::MakeRandomVolume(m_volume, type, random);
-    m_memory.PutUnder(m_slice.GetImage(), {.width = rasters::RandomSize(random, 12),
-                                           .height = rasters::RandomSize(random, 9),
-                                           .type = type,
-                                           .alignment = rasters::RandomAlignment(random)});
-    rasters::PlacePlane(m_slice, m_volume, random);
-    m_op.volume = &m_volume;
-    m_op.mprSlice = &m_slice;
-    m_op.SelectAlgo(random.Between(101, 102));
-    m_op.SetDepthSteps(random.Pick(kDepthSteps));
-  }
-
-  testing::Message Text() const {
-    return testing::Message() << "algorithm " << m_op.algoID << ", depth steps " << m_op.depthSteps
-                              << ", " << rasters::TextOf(m_volume, m_slice);
-  }
-
-  void Check(Coverage& coverage) {
-    mpr_model::Model<T> model(m_volume, m_op.algoID == MPRAlgo_Trilinear, coverage);
-    const std::vector<T> expected = model.Run(m_slice, m_volume.GetCoordinates(), m_op.depthSteps);
-    ASSERT_TRUE(m_op.Run()) << rasters::MessageOf(m_op);
-    ASSERT_EQ(rasters::SamplesOf<T>(m_slice.GetImage()), expected);
-    m_memory.ExpectSurroundingsUntouched();
-  }
-
- private:
-  dVolume m_volume;
-  dSlice m_slice;
-  GuardedMemory m_memory;
-  opMPR m_op;
+struct Traits {
+  using Op = opMPR;
+  template <class T>
+  using Model = mpr_model::Model<T>;
+  static constexpr int kNearest = MPRAlgo_Nearest;
+  static constexpr int kTrilinear = MPRAlgo_Trilinear;
+  static constexpr std::array<int, 8> kDepthSteps = {0, 0, -1, -1, 1, 2, 5, 300};
+  static void SetSlice(Op& op, dSlice& slice) { op.mprSlice = &slice; }
 };
 
-// Fails when the cases have not met what they are there for.
-void ExpectCoverage(const Coverage& coverage) {
-  EXPECT_GT(coverage.inside, 2000);
-  EXPECT_GT(coverage.outside, 2000);
-  EXPECT_GT(coverage.partlyInside, 200);
-  EXPECT_GT(coverage.wrapped, 200);
-  EXPECT_GT(coverage.floored, 200);
-  EXPECT_GT(coverage.onLastPlane, 200);
-}
-
-template <class T>
-void CheckCases(unsigned short type, std::uint32_t seed) {
-  Random random(seed);
-  Coverage coverage;
-  for (int i = 0; i < 1000; ++i) {
-    Case<T> testCase(type, random);
-    SCOPED_TRACE(testing::Message() << "case " << i << ": " << testCase.Text());
-    testCase.Check(coverage);
-    if (testing::Test::HasFatalFailure()) {
-      return;
-    }
-  }
-  ExpectCoverage(coverage);
-}
-
 TEST(opMPRModel, UnsignedVolumesEqualTheModelBitForBit) {
-  CheckCases<std::uint16_t>(ImageDataType_U16, 1);
+  plane_cases::CheckCases<Traits, std::uint16_t>(ImageDataType_U16, 1);
 }
 
 TEST(opMPRModel, SignedVolumesEqualTheModelBitForBit) {
-  CheckCases<std::int16_t>(ImageDataType_S16, 2);
+  plane_cases::CheckCases<Traits, std::int16_t>(ImageDataType_S16, 2);
 }
 
 // Planes that touch the borders of the voxels exactly.

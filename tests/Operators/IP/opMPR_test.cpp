@@ -6,6 +6,7 @@
 
 #include <array>
 #include <cstdint>
+#include <numeric>
 #include <vector>
 
 #include "Volumes.h"
@@ -194,18 +195,30 @@ TEST(opMPR, RefusesASliceWithShorterRowsThanTheFirst) {
   ExpectFailure(bench.op, "invalid pixel data in slice 1 of the Volume");
 }
 
-TEST(opMPR, TakesASliceWithLongerRowsThanTheFirst) {
+// Rows are taken as far apart as those of slice 0, in every slice.
+TEST(opMPR, ReadsASliceWithLongerRowsAtTheFirstSlicesPitch) {
   dVolume volume;
   for (const unsigned short alignment : std::to_array<unsigned short>({2, 32})) {
     dSlice slice;
-    Make(slice.GetImage(),
-         {.width = 2, .height = 2, .type = ImageDataType_U16, .alignment = alignment});
-    slice.GetImage().Fill(1);
+    dImage& image = slice.GetImage();
+    Make(image, {.width = 2, .height = 2, .type = ImageDataType_U16, .alignment = alignment});
+    auto* samples = static_cast<std::uint16_t*>(image.GetDataPtr());
+    std::iota(samples, samples + image.GetImageSize() / 2, std::uint16_t{alignment});
     ASSERT_GE(volume.AddSlice(slice), 0);
   }
   Workbench bench;
   bench.op.volume = &volume;
-  EXPECT_TRUE(bench.op.Run());
+  for (const int algo : {101, 102}) {
+    bench.op.SelectAlgo(algo);
+    bench.slice.SetPosition(dVect3D(0, 0, 0));
+    EXPECT_TRUE(bench.op.Run());
+    EXPECT_EQ(rasters::SamplesOf<std::uint16_t>(bench.slice.GetImage()),
+              (std::vector<std::uint16_t>{2, 3, 4, 5}));
+    bench.slice.SetPosition(dVect3D(0, 0, 1));
+    EXPECT_TRUE(bench.op.Run());
+    EXPECT_EQ(rasters::SamplesOf<std::uint16_t>(bench.slice.GetImage()),
+              (std::vector<std::uint16_t>{32, 33, 34, 35}));
+  }
 }
 
 TEST(opMPR, RefusesBuffersThatDoNotHoldTheRows) {

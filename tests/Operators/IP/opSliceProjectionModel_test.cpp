@@ -50,6 +50,7 @@ class Case {
     for (int i = m_random.Between(1, 4); i > 0; --i) {
       const int object = m_random.Between(0, 2);
       Model<T> model(m_plane, m_op.zBuffer, m_op.borderValue, coverage[object]);
+      const rasters::Bytes volumeBefore = rasters::BytesOf(m_volume);
       switch (object) {
         case 0:
           DrawSlice(model);
@@ -65,6 +66,7 @@ class Case {
       ASSERT_EQ(Raster<std::int16_t>(m_op.zBuffer).samples, model.depths.samples);
       m_planeMemory.ExpectGuardsUntouched();
       m_depthMemory.ExpectGuardsUntouched();
+      ASSERT_EQ(rasters::BytesOf(m_volume), volumeBefore);
     }
   }
 

@@ -92,6 +92,7 @@ void CheckCase(unsigned short type, Random& random, Coverage& coverage) {
   const bool signedValues = type == ImageDataType_S16 && algo == 401;
   const std::vector<Classified> classes = ClassesOf<T>(bench.volume, algo);
 
+  const rasters::Bytes volumeBefore = rasters::BytesOf(bench.volume);
   bench.Classify(static_cast<short>(algo));
   ASSERT_EQ(classification_bench::CountsOf(bench.op, signedValues ? 32768 : 0),
             CountsOf(classes, algo));
@@ -109,6 +110,7 @@ void CheckCase(unsigned short type, Random& random, Coverage& coverage) {
        : expected.size() == classes.size() ? coverage.all
                                            : coverage.some);
   }
+  ASSERT_EQ(rasters::BytesOf(bench.volume), volumeBefore);
 }
 
 template <class T>

@@ -222,7 +222,9 @@ TEST(opVoxelClassification, RefusesASliceThatDoesNotHoldItsOwnRows) {
   ExpectFailure(op, "invalid pixel data in slice 1 of the Volume");
   pixels.Delete();
   pixels.Init(memory, 34, DTM_Reference);
+  memory[32] = 7;  // the second row
   EXPECT_TRUE(op.Run());
+  EXPECT_EQ(classification_bench::CountsOf(op), (classification_bench::Counts{{0, 3}, {7, 1}}));
 }
 
 TEST(opVoxelClassification, SelectionRefusesCountersThatAreNotThere) {

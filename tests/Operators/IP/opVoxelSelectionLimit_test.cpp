@@ -26,6 +26,8 @@ TEST(opVoxelSelectionLimit, IntegersOfEveryKindAreNumbersOfVoxels) {
   EXPECT_EQ(op.selectionLimit, 13U);
   op.SetSelectionLimit(14UL);
   EXPECT_EQ(op.selectionLimit, 14U);
+  op.SetSelectionLimit(16ULL);
+  EXPECT_EQ(op.selectionLimit, 16U);
   op.SetSelectionLimit(static_cast<short>(15));
   EXPECT_EQ(op.selectionLimit, 15U);
   op.SetSelectionLimit(std::uint32_t{0xFFFFFFFF});

@@ -161,9 +161,19 @@ TEST(opVoxelSelection, ListOverForeignMemoryIsFilledThereAtAnyAddress) {
   std::vector<unsigned char> memory(11, 0xA5);
   bench.list.Init(memory.data() + 1, 8, DTM_Reference);
   EXPECT_EQ(bench.Select(2), (Entries{0, 1}));
-  EXPECT_EQ(memory[0], 0xA5);
-  EXPECT_EQ(memory[9], 0xA5);
-  EXPECT_EQ(memory[10], 0xA5);
+  EXPECT_EQ(memory, (std::vector<unsigned char>{0xA5, 0, 0, 0, 0, 1, 0, 0, 0, 0xA5, 0xA5}));
+}
+
+TEST(opVoxelSelection, ClassCountersCannotBeTheList) {
+  Workbench bench(ImageDataType_U16, 4, Unsigned{4, 3, 2, 1});
+  bench.Classify(401);
+  const auto counters = classification_bench::CountersOf(bench.op);
+  bench.op.voxelList = &bench.op.classCounters;
+  bench.op.SelectAlgo(403);
+  bench.op.SetSelectionLimit(2);
+  EXPECT_FALSE(bench.op.Run());
+  EXPECT_EQ(rasters::MessageOf(bench.op), "the class counters can't be the 'Voxel List'");
+  EXPECT_EQ(classification_bench::CountersOf(bench.op), counters);
 }
 
 }  // namespace

@@ -22,8 +22,9 @@ TEST(CommandLine, HelpNamesAllCommandsAndGivesExamples) {
   EXPECT_EQ(outcome.code, 0);
   EXPECT_EQ(outcome.errors, "");
   EXPECT_TRUE(Contains(outcome.output, "Usage: vorl COMMAND ..."));
-  for (const char* part : {"\n  info ", "\n  mpr ", "\n  convert ", "\n  phantom ", "Examples:\n",
-                           "The exit code is 0 after success"}) {
+  for (const char* part :
+       {"\n  info ", "\n  mpr ", "\n  mip ", "\n  project ", "\n  select ", "\n  convert ",
+        "\n  phantom ", "\n  bmp ", "Examples:\n", "The exit code is 0 after success"}) {
     EXPECT_TRUE(Contains(outcome.output, part)) << part;
   }
   EXPECT_EQ(RunTool({"-h"}).output, outcome.output);
@@ -64,6 +65,20 @@ INSTANTIATE_TEST_SUITE_P(
                   "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z", "--size WxH", "--spacing MM",
                   "--thickness MM", "--steps N", "--filter NAME", "--window WINDOW",
                   "--brightness B", "--contrast C", "--gamma G", "-q,--quiet"}},
+        HelpCase{"mip",
+                 "INPUT... -o OUT.png|OUT.bmp\n",
+                 {"--series SERIES", "--phantom[=WxHxN]", "-o,--output FILE", "--turntable N",
+                  "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z", "--size WxH", "--spacing MM",
+                  "--slab MM", "--filter NAME", "--window WINDOW", "--gamma G", "-q,--quiet"}},
+        HelpCase{"project",
+                 "INPUT... -o OUT.png|OUT.bmp\n",
+                 {"-o,--output FILE", "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z",
+                  "--size WxH", "--spacing MM", "--slices LIST", "--volume NAME", "--filter NAME",
+                  "--window WINDOW", "-q,--quiet"}},
+        HelpCase{"select",
+                 "INPUT... -o LIST.bdf\n",
+                 {"--by NAME", "--limit N|P%", "-o,--output LIST.bdf", "--draw FILE",
+                  "--plane NAME", "--window WINDOW", "-q,--quiet"}},
         HelpCase{"convert", "INPUT... OUT.bdf\n", {"--series SERIES", "--phantom[=WxHxN]"}},
         HelpCase{"phantom", "OUT.bdf\n", {"--size WxHxN", "--encoding NAME"}}),
     [](const auto& one) { return std::string(one.param.command); });
@@ -106,10 +121,14 @@ constexpr const char* kPhantom = "--phantom=4x4x4";
 INSTANTIATE_TEST_SUITE_P(
     Commands, WrongUsage,
     testing::Values(
-        UsageCase{"NoCommand", {}, "no command is named; there are info, mpr, convert, phantom"},
+        UsageCase{"NoCommand",
+                  {},
+                  "no command is named; there are info, mpr, mip, project, select, convert, "
+                  "phantom, bmp"},
         UsageCase{"UnknownCommand",
                   {"show", "x"},
-                  "there is no command 'show'; there are info, mpr, convert, phantom"},
+                  "there is no command 'show'; there are info, mpr, mip, project, select, convert, "
+                  "phantom, bmp"},
         UsageCase{"OptionInsteadOfCommand",
                   {"--fast"},
                   "the following argument was not expected: --fast"},

@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <string>
 
+#include <sys/stat.h>
+
 #include "../TestFolder.h"
 
 namespace {
@@ -169,6 +171,18 @@ TEST(Info, MissingAndForeignInputsAreFailures) {
   EXPECT_EQ(outcome.output, "");
   EXPECT_EQ(outcome.errors.substr(0, 6), "vorl: ");
   EXPECT_EQ(Lines(outcome.errors).size(), 1u);
+}
+
+TEST(Info, PipesAndDevicesAreNoInputsAndNobodyWaitsForThem) {
+  const TestFolder folder;
+  const std::string pipe = (folder / "pipe.bdf").string();
+  ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+  for (const std::string& path : {pipe, std::string("/dev/null")}) {
+    const Outcome outcome = RunTool({"info", path});
+    EXPECT_EQ(outcome.code, 1);
+    EXPECT_EQ(outcome.output, "");
+    EXPECT_EQ(outcome.errors, "vorl: '" + path + "' is neither a file nor a folder\n");
+  }
 }
 
 TEST(Info, OutputThatCantBeWrittenIsAFailure) {

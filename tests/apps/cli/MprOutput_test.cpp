@@ -28,6 +28,9 @@ TEST_F(OutputFailure, AFullDeviceIsAnError) {
   const std::string message = "can't write '/dev/full': No space left on device";
   ExpectFailure(RunTool({"mpr", kPhantom, "-o", "/dev/full"}), message);
   ExpectFailure(RunTool({"mpr", kPhantom, "--save-slice", "/dev/full"}), message);
+  ExpectFailure(RunTool({"mip", kPhantom, "-o", "/dev/full"}), message);
+  ExpectFailure(RunTool({"project", kPhantom, "-o", "/dev/full"}), message);
+  ExpectFailure(RunTool({"select", kPhantom, "-o", "/dev/full"}), message);
   ExpectFailure(RunTool({"convert", kPhantom, "/dev/full"}), message);
   ExpectFailure(RunTool({"phantom", "--size", "8x8x8", "/dev/full"}), message);
 }
@@ -48,6 +51,9 @@ TEST_F(OutputFailure, AFullDiskLeavesNoFileAndKeepsTheEarlierOne) {
        {std::pair<const char*, Arguments>{"a.png", {"mpr", kPhantom, "-o"}},
         std::pair<const char*, Arguments>{"a.bmp", {"mpr", kPhantom, "-o"}},
         std::pair<const char*, Arguments>{"a.bdf", {"mpr", kPhantom, "--save-slice"}},
+        std::pair<const char*, Arguments>{"m.bmp", {"mip", kPhantom, "-o"}},
+        std::pair<const char*, Arguments>{"p.bmp", {"project", kPhantom, "-o"}},
+        std::pair<const char*, Arguments>{"s.bdf", {"select", kPhantom, "-o"}},
         std::pair<const char*, Arguments>{"b.bdf", {"convert", kPhantom}},
         std::pair<const char*, Arguments>{"c.bdf", {"phantom", "--size", "64x64x40"}}}) {
     SCOPED_TRACE(name);

@@ -76,6 +76,10 @@ TEST(Progress, APipeGetsNoControlCharacters) {
   for (const Arguments& arguments :
        {Arguments{"info", "--phantom=48x48x48"},
         Arguments{"mpr", "--phantom=48x48x48", "-o", (folder / "a.png").string()},
+        Arguments{"mip", "--phantom=48x48x48", "-o", (folder / "a.png").string()},
+        Arguments{"project", "--phantom=48x48x48", "-o", (folder / "a.png").string()},
+        Arguments{"select", "--phantom=48x48x48", "-o", (folder / "l.bdf").string(), "--draw",
+                  (folder / "a.png").string()},
         Arguments{"convert", "--phantom=48x48x48", (folder / "a.bdf").string()},
         Arguments{"phantom", "--size", "48x48x48", (folder / "b.bdf").string()}}) {
     const Outcome outcome = RunTool(arguments);

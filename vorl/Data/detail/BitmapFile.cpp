@@ -23,6 +23,14 @@ bool IsDevice(const char* path) {
 
 }  // namespace
 
+void RowBuffer::Attach(std::FILE* file) {
+  constexpr std::size_t size = 131072;
+  m_bytes.reset(new (std::nothrow) char[size]);
+  if (m_bytes != nullptr) {
+    std::setvbuf(file, m_bytes.get(), _IOFBF, size);
+  }
+}
+
 bool FileExists(const char* path) {
   std::error_code error;
   return fs::exists(path, error);
@@ -40,6 +48,9 @@ BitmapFile::BitmapFile(const char* path) : m_file(nullptr) {
   try {
     m_path = path;
     m_file = OpenForWriting(path);
+    if (m_file != nullptr) {
+      m_buffer.Attach(m_file);
+    }
   } catch (const std::bad_alloc&) {
     m_file = nullptr;  // a file whose name is not known could not be removed again
   }

@@ -12,6 +12,9 @@ namespace vorl_detail {
 /// What still counts as zero. The comparison includes the bound.
 inline constexpr double kNearZero = 1e-6;
 
+/// What converts degrees, with pi taken as 3.1415926535 throughout.
+inline constexpr double kRadPerDegree = 0.017453292519444445;
+
 inline bool NearZero(double value) {
   return std::abs(value) <= kNearZero;
 }

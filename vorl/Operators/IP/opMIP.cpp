@@ -8,9 +8,9 @@
 #include <algorithm>
 
 #include <vorl/Common/detail/ClassRegistration.h>
-#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mip.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
+#include <vorl/Operators/IP/kernels/SamplingCheck.h>
 #include <vorl/Operators/IP/kernels/VolumeProjection.h>
 
 inline namespace vorl {
@@ -20,6 +20,12 @@ using vorl_detail::NearestSampler;
 using vorl_detail::SlabSamples;
 using vorl_detail::TrilinearSampler;
 using vorl_detail::VolumeView;
+
+namespace {
+
+constexpr char kSliceName[] = "MIP Slice";
+
+}  // namespace
 
 VORL_REGISTER_CLASS(opMIP, OpBase);
 
@@ -53,24 +59,19 @@ void opMIP::SetDepthSteps(int count) {
 }
 
 bool opMIP::Prepare() {
-  if (volume == nullptr) {
-    m_status.Set(false, "missing input parameter 'Volume'");
-  } else if (!volume->IsValid()) {
-    m_status.Set(false, "given Volume is empty");
-  } else if (mipSlice == nullptr) {
-    m_status.Set(false, "missing input parameter 'MIP Slice'");
-  } else if (mipSlice->GetDataType() != volume->GetDataType()) {
-    m_status.Set(false, "incompatible data types(Volume: 0x%x, Slice: 0x%x", volume->GetDataType(),
-                 mipSlice->GetDataType());
-  } else if (algoID == MIPAlgo_VoxelList && voxelList == nullptr) {
-    m_status.Set(false, "missing input parameter 'Voxel List'");
-  } else if (algoID == MIPAlgo_VoxelList && voxelList->GetSize() == 0) {
-    m_status.Set(false, "'Voxel List' is empty");
-  } else {
-    m_status = true;
-    return m_stopRequested ? Stopped() : true;
+  if (!vorl_detail::CheckSampling(volume, mipSlice, kSliceName, m_status)) {
+    return false;
   }
-  return false;
+  if (algoID == MIPAlgo_VoxelList && voxelList == nullptr) {
+    m_status.Set(false, "missing input parameter 'Voxel List'");
+    return false;
+  }
+  if (algoID == MIPAlgo_VoxelList && voxelList->GetSize() == 0) {
+    m_status.Set(false, "'Voxel List' is empty");
+    return false;
+  }
+  m_status = true;
+  return m_stopRequested ? Stopped() : true;
 }
 
 bool opMIP::Process() {
@@ -78,32 +79,20 @@ bool opMIP::Process() {
     m_status.Set(false, "invalid MIP Algo ID: %d", algoID);
     return false;
   }
-  const unsigned short dataType = volume->GetDataType();
-  if (dataType != ImageDataType_U16 && dataType != ImageDataType_S16) {
-    m_status.Set(false, "unsupported data type: %d", dataType);
+  if (!vorl_detail::CheckSamples(*volume, *mipSlice, kSliceName, m_status)) {
     return false;
   }
-  if (!vorl_detail::CheckPixels(*volume, m_status)) {
-    return false;
+  const bool isSigned = volume->GetDataType() == ImageDataType_S16;
+  bool ok = false;
+  if (algoID == MIPAlgo_VoxelList) {
+    ok = isSigned ? MIPVoxelListS16(*volume, *voxelList, *mipSlice)
+                  : MIPVoxelListU16(*volume, *voxelList, *mipSlice);
+  } else if (algoID == MIPAlgo_Trilinear) {
+    ok = isSigned ? MIPTrilinearS16(*volume, *mipSlice) : MIPTrilinearU16(*volume, *mipSlice);
+  } else {
+    ok = isSigned ? MIPNearestS16(*volume, *mipSlice) : MIPNearestU16(*volume, *mipSlice);
   }
-  if (!vorl_detail::HoldsRows(mipSlice->GetImage())) {
-    m_status.Set(false, "invalid pixel data in the MIP Slice");
-    return false;
-  }
-  const bool isSigned = dataType == ImageDataType_S16;
-  switch (algoID) {
-    case MIPAlgo_Nearest:
-      isSigned ? MIPNearestS16(*volume, *mipSlice) : MIPNearestU16(*volume, *mipSlice);
-      break;
-    case MIPAlgo_Trilinear:
-      isSigned ? MIPTrilinearS16(*volume, *mipSlice) : MIPTrilinearU16(*volume, *mipSlice);
-      break;
-    default:
-      isSigned ? MIPVoxelListS16(*volume, *voxelList, *mipSlice)
-               : MIPVoxelListU16(*volume, *voxelList, *mipSlice);
-      break;
-  }
-  return m_stopRequested ? Stopped() : true;
+  return m_stopRequested ? Stopped() : ok;
 }
 
 template <class T, class Sampler>
@@ -119,10 +108,10 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
   return true;
 }
 
-// A voxel is admitted when its place in the slice is outside in both directions; admitted voxels
-// end the loop once as many as the list is long have come. What lies outside the raster is not
-// drawn, so the slice stays as it is; both rules are kept for the files and programs that rely on
-// them.
+// A voxel is admitted when its place in the slice is outside in both directions; the loop ends once
+// as many have been admitted as the list is long. What lies outside the raster is not drawn, so
+// together the two rules draw nothing: the slice stays as it is. Both are written out nevertheless,
+// so that a change of the one finds the other in place.
 template <class T>
 bool opMIP::ProjectList(dVolume& source, dBuffer& list, dSlice& target) {
   const VolumeView view(source);

@@ -7,9 +7,9 @@
 #include <vorl/Operators/IP/opMPR.h>
 
 #include <vorl/Common/detail/ClassRegistration.h>
-#include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
+#include <vorl/Operators/IP/kernels/SamplingCheck.h>
 
 inline namespace vorl {
 
@@ -18,6 +18,12 @@ using vorl_detail::NearestSampler;
 using vorl_detail::SlabSamples;
 using vorl_detail::TrilinearSampler;
 using vorl_detail::VolumeView;
+
+namespace {
+
+constexpr char kSliceName[] = "MPR Slice";
+
+}  // namespace
 
 VORL_REGISTER_CLASS(opMPR, OpBase);
 
@@ -50,20 +56,11 @@ void opMPR::SetDepthSteps(int count) {
 }
 
 bool opMPR::Prepare() {
-  if (volume == nullptr) {
-    m_status.Set(false, "missing input parameter 'Volume'");
-  } else if (!volume->IsValid()) {
-    m_status.Set(false, "given Volume is empty");
-  } else if (mprSlice == nullptr) {
-    m_status.Set(false, "missing input parameter 'MPR Slice'");
-  } else if (mprSlice->GetDataType() != volume->GetDataType()) {
-    m_status.Set(false, "incompatible data types(Volume: 0x%x, Slice: 0x%x", volume->GetDataType(),
-                 mprSlice->GetDataType());
-  } else {
-    m_status = true;
-    return m_stopRequested ? Stopped() : true;
+  if (!vorl_detail::CheckSampling(volume, mprSlice, kSliceName, m_status)) {
+    return false;
   }
-  return false;
+  m_status = true;
+  return m_stopRequested ? Stopped() : true;
 }
 
 bool opMPR::Process() {
@@ -71,16 +68,7 @@ bool opMPR::Process() {
     m_status.Set(false, "invalid MPR Algo ID: %d", algoID);
     return false;
   }
-  const unsigned short dataType = volume->GetDataType();
-  if (dataType != ImageDataType_U16 && dataType != ImageDataType_S16) {
-    m_status.Set(false, "unsupported data type: %d", dataType);
-    return false;
-  }
-  if (!vorl_detail::CheckPixels(*volume, m_status)) {
-    return false;
-  }
-  if (!vorl_detail::HoldsRows(mprSlice->GetImage())) {
-    m_status.Set(false, "invalid pixel data in the MPR Slice");
+  if (!vorl_detail::CheckSamples(*volume, *mprSlice, kSliceName, m_status)) {
     return false;
   }
   using Worker = bool (opMPR::*)(dVolume&, dSlice&);
@@ -89,10 +77,10 @@ bool opMPR::Process() {
        {&opMPR::MPRThinTrilinearU16, &opMPR::MPRThickTrilinearU16}},
       {{&opMPR::MPRThinNearestS16, &opMPR::MPRThickNearestS16},
        {&opMPR::MPRThinTrilinearS16, &opMPR::MPRThickTrilinearS16}}};
-  const Worker worker = kWorkers[dataType == ImageDataType_S16 ? 1 : 0]
+  const Worker worker = kWorkers[volume->GetDataType() == ImageDataType_S16 ? 1 : 0]
                                 [algoID == MPRAlgo_Trilinear ? 1 : 0][depthSteps != 0 ? 1 : 0];
-  (this->*worker)(*volume, *mprSlice);
-  return m_stopRequested ? Stopped() : true;
+  const bool ok = (this->*worker)(*volume, *mprSlice);
+  return m_stopRequested ? Stopped() : ok;
 }
 
 template <class T, class Sampler>

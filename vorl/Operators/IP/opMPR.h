@@ -12,7 +12,10 @@
 inline namespace vorl {
 
 /// The algorithms of `opMPR`.
-enum MPRAlgo : std::int32_t { MPRAlgo_Trilinear = 101, MPRAlgo_Nearest = 102 };
+enum MPRAlgo : std::int32_t {
+  MPRAlgo_Trilinear = 101,  ///< interpolated between voxels
+  MPRAlgo_Nearest = 102     ///< the voxel whose cell holds the point
+};
 
 /// Resamples a volume on a plane, thin or as the mean across a slab.
 ///
@@ -24,11 +27,14 @@ enum MPRAlgo : std::int32_t { MPRAlgo_Trilinear = 101, MPRAlgo_Nearest = 102 };
 /// *Units and frame.* Points are carried into the voxel coordinates of the volume and walked in
 /// 16.16 fixed point. Voxel (i, j, k) covers the cell from i to i + 1 in each direction; nearest
 /// takes the voxel whose cell holds the point, trilinear weighs the voxel and its upper neighbours
-/// (at the last one the voxel itself) by the fractions. A point outside the volume gives 0.
+/// (at the last one the voxel itself) by the fractions. Of the two rows the lower one counts the
+/// difference between its columns with the opposite sign, on purpose. A point outside the volume
+/// gives 0. The volume's slices have one channel and rows without padding.
 ///
-/// *Range.* Trilinear results below 0 are stored as 0. Volumes have fewer than 32,768 voxels in
-/// each direction, and so far may the plane reach: positions wrap at 32 bits. Pixels whose place
-/// is not a number lie outside.
+/// *Range.* Trilinear results below 0 are stored as 0; above the data type's largest value the low
+/// 16 bits are stored; products of a difference and a fraction wrap at 32 bits, which differences
+/// above 32,767 can reach. Volumes have fewer than 32,768 voxels in each direction, and so far may
+/// the plane reach: positions wrap at 32 bits. A plane whose place is not a number lies outside.
 ///
 /// *Stopping.* A stop request ends the run within one output row, with the status "stopped"; the
 /// rows before it are written.
@@ -38,7 +44,7 @@ enum MPRAlgo : std::int32_t { MPRAlgo_Trilinear = 101, MPRAlgo_Nearest = 102 };
 /// "unsupported data type: %d", "invalid pixel data in slice %d of the Volume" (a slice whose
 /// pixels were taken away or laid out otherwise after it was added, or whose rows are shorter than
 /// those of slice 0), "invalid pixel data in the MPR Slice" (its buffer was exchanged for one that
-/// does not hold its rows).
+/// does not hold its rows), "out of memory".
 class VORL_API opMPR : public OpBase {
  public:
   opMPR();
@@ -64,10 +70,10 @@ class VORL_API opMPR : public OpBase {
   /// voxel that the thickness crosses along its dominant axis.
   void SetDepthSteps(int count);
 
-  dSlice* mprSlice = nullptr;  ///< output; not owned
-  dVolume* volume = nullptr;   ///< input; not owned
-  std::int32_t algoID = MPRAlgo_Nearest;
-  std::int32_t depthSteps = 0;
+  dSlice* mprSlice = nullptr;             ///< output; not owned
+  dVolume* volume = nullptr;              ///< input; not owned
+  std::int32_t algoID = MPRAlgo_Nearest;  ///< an `MPRAlgo`
+  std::int32_t depthSteps = 0;            ///< see `SetDepthSteps`
 
  private:
   template <class T, class Sampler>

@@ -23,10 +23,12 @@ enum SliceProjectionAlgo : std::int32_t {
 ///
 /// Set the plane, call `InitZBuffer` and `ClearProjectionPlane`, then run the operator once per
 /// object to draw, changing algorithm and inputs between runs: several slices first, for example,
-/// then the volume behind them. Plane and depth buffer keep what was drawn.
+/// then the volume, of which only what lies in front of the slices is then seen through to them.
+/// Plane and depth buffer keep what was drawn.
 ///
 /// *Shape.* The plane's image is allocated by the caller with the data type of slices and volume
-/// (unsigned or signed 16-bit). A volume is required for every algorithm.
+/// (unsigned or signed 16-bit). A volume is required for every algorithm. Slices and volume have
+/// one channel; the volume's rows have no padding, nor have the plane's for voxel lists.
 ///
 /// *Units and frame.* Depths are whole steps along the plane's axisZ, smaller ones nearer; the
 /// depth buffer holds the nearest drawn so far for each pixel, 32767 for none.
@@ -34,17 +36,19 @@ enum SliceProjectionAlgo : std::int32_t {
 /// *Outlines.* A slice's first and last rows and columns are drawn in the border value, and so are
 /// its columns 1 to 7 of rows 1 to 7: a mark at its first pixel.
 ///
-/// *Stopping.* A stop request ends the run within one row, with the status "stopped".
+/// *Stopping.* A stop request ends the run within one row, or within 4,096 listed voxels, with the
+/// status "stopped".
 ///
 /// *Errors.* "missing input parameter 'Projection Slice'", "no slice to project", "incompatible
 /// data types(Projection Plane: 0x%x, Slice: 0x%x", "no volume to project", "given Volume is
 /// empty", "incompatible data types(Projection Plane: 0x%x, Volume: 0x%x", "no voxel list to
 /// project", "Z-Buffer is incompatible to 'Projection Plane'", "unsupported data type: %d" (also
 /// for an unknown algorithm), "invalid pixel data in slice %d of the Volume" (a slice whose pixels
-/// were taken away or laid out otherwise after it was added), "invalid pixel data in the Projection
-/// Plane", "... the Z Buffer" or "... the Slice" (its buffer was exchanged for one that does not
-/// hold its rows, or the depth buffer for one of another data type), "error while initializing the
-/// 'Z Buffer'". `SliceProjectionAlgo_SliceBack` fails without a message.
+/// were taken away or laid out otherwise after it was added, or whose rows are shorter than those
+/// of slice 0), "invalid pixel data in the Projection Plane", "... the Z Buffer" or "... the Slice"
+/// (its buffer was exchanged for one that does not hold its rows, or the depth buffer for one of
+/// another data type), "error while initializing the 'Z Buffer'", "out of memory".
+/// `SliceProjectionAlgo_SliceBack` fails without a message.
 class VORL_API opSliceProjection : public OpBase {
  public:
   opSliceProjection();
@@ -69,7 +73,7 @@ class VORL_API opSliceProjection : public OpBase {
   /// The value in which outlines are drawn.
   void SetBorderValue(unsigned short value);
   /// Formats the depth buffer like the plane and sets every depth to the farthest; without a plane,
-  /// empties it. False, with a status, when there is no memory.
+  /// empties it. False, with a status, when there is no memory or the plane has no pixels.
   bool InitZBuffer();
   /// Fills the plane with 0.
   void ClearProjectionPlane();
@@ -79,11 +83,12 @@ class VORL_API opSliceProjection : public OpBase {
   dBuffer* voxelList = nullptr;       ///< packed voxel addresses; not owned
   dVolume* volume = nullptr;          ///< not owned
   dImage zBuffer;                     ///< signed 16-bit, one depth per pixel of the plane
-  std::int32_t algoID = SliceProjectionAlgo_Slice;
-  std::uint16_t borderValue = 0xFFFF;
+  std::int32_t algoID = SliceProjectionAlgo_Slice;  ///< a `SliceProjectionAlgo`
+  std::uint16_t borderValue = 0xFFFF;               ///< of outlines and marks
 
  protected:
-  /// The workers of the algorithms, one per data type.
+  /// The workers of the algorithms, one per data type. They rely on what `Prepare` and `Process`
+  /// check before: inputs of one type, and pixels and depths where their formats say.
   bool SliceProjectionU16(dSlice* source, dSlice* plane);
   bool SliceProjectionS16(dSlice* source, dSlice* plane);
   bool VolumeBackProjectionU16(dVolume* source, dSlice* plane);

@@ -81,11 +81,15 @@ void opVoxelClassification::SelectAlgo(short id) {
 }
 
 void opVoxelClassification::SetSelectionLimit(unsigned long voxels) {
+  SetSelectionLimit(static_cast<unsigned long long>(voxels));
+}
+
+void opVoxelClassification::SetSelectionLimit(unsigned long long voxels) {
   selectionLimit = static_cast<std::uint32_t>(std::min<unsigned long long>(voxels, kLargestLimit));
 }
 
 void opVoxelClassification::SetSelectionLimit(long voxels) {
-  SetSelectionLimit(static_cast<unsigned long>(voxels));
+  SetSelectionLimit(static_cast<unsigned long long>(voxels));
 }
 
 void opVoxelClassification::SetSelectionLimit(unsigned int voxels) {
@@ -93,7 +97,7 @@ void opVoxelClassification::SetSelectionLimit(unsigned int voxels) {
 }
 
 void opVoxelClassification::SetSelectionLimit(int voxels) {
-  SetSelectionLimit(static_cast<unsigned long>(voxels));
+  SetSelectionLimit(static_cast<unsigned long long>(voxels));
 }
 
 void opVoxelClassification::SetSelectionLimit(double percent) {
@@ -168,6 +172,10 @@ bool opVoxelClassification::AllocateList() {
   }
   if (voxelList == nullptr) {
     m_status.Set(false, "missing input parameter 'Voxel List'");
+    return false;
+  }
+  if (voxelList == &classCounters) {
+    m_status.Set(false, "the class counters can't be the 'Voxel List'");
     return false;
   }
   const std::uint64_t bytes = std::uint64_t{selectionLimit} * kEntryBytes;
@@ -305,8 +313,10 @@ bool opVoxelClassification::Select(int classAlgo, const dVolume& source, const d
   } else {
     select(vorl_detail::ValueClass{});
   }
-  list.Resize(static_cast<unsigned long>(written) * kEntryBytes);
-  return true;
+  // A list in foreign memory becomes one of its own here, for which there may be no memory.
+  const unsigned long bytes = static_cast<unsigned long>(written) * kEntryBytes;
+  list.Resize(bytes);
+  return list.GetSize() == bytes;
 }
 
 bool opVoxelClassification::ClassifyVoxelsU16(int algo, dVolume* source, const dVOI* region,

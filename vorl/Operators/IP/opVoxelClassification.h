@@ -31,7 +31,13 @@ enum VoxelClassificationAlgo : std::int16_t {
 /// low 12 bits of a voxel rise above the lower of its right and lower neighbours, 0 when they do
 /// not; the last column and the last row are left out.
 ///
-/// *Voxel list.* Packed addresses, (z << 22) | (y << 11) | x, in the order z, y, x.
+/// *Voxel list.* Packed addresses, (z << 22) | (y << 11) | x, in the order z, y, x. There is room
+/// for 2048 columns, 2048 rows and 1024 slices, of which the projections read 512: in larger
+/// volumes the parts of an address run into each other. Where all voxels fit under the limit, a
+/// selection by edge strength also lists those that do not rise above their neighbours. A list that
+/// refers to foreign memory becomes one of its own.
+///
+/// *Shape.* One channel of unsigned or signed 16-bit samples; rows may be padded.
 ///
 /// *Stopping.* A stop request ends the run within one row of voxels, with the status "stopped".
 ///
@@ -41,7 +47,8 @@ enum VoxelClassificationAlgo : std::int16_t {
 /// 'Voxel List'", "can't create voxel list[Size: %d]", "invalid algo ID: %d", "unsupported data
 /// type: %d", "voxel classification error", "voxel selection error", "invalid pixel data in slice
 /// %d of the Volume" (a slice whose pixels were taken away or laid out otherwise after it was
-/// added). After a failed classification no selection runs.
+/// added, or whose rows are shorter than those of slice 0), "the class counters can't be the 'Voxel
+/// List'", "out of memory". After a failed classification no selection runs.
 class VORL_API opVoxelClassification : public OpBase {
  public:
   opVoxelClassification();
@@ -66,6 +73,8 @@ class VORL_API opVoxelClassification : public OpBase {
   /// The largest number of voxels that a selection lists; 0 for not specified. A number beyond 32
   /// bits counts as the largest one, for which no list can be created.
   void SetSelectionLimit(unsigned long voxels);
+  void SetSelectionLimit(unsigned long long voxels);
+  /// A negative number counts as the largest one.
   void SetSelectionLimit(long voxels);
   void SetSelectionLimit(unsigned int voxels);
   void SetSelectionLimit(int voxels);
@@ -76,9 +85,9 @@ class VORL_API opVoxelClassification : public OpBase {
   dBuffer* voxelList = nullptr;  ///< output of a selection, which sizes it; not owned
   dBuffer classCounters;         ///< one unsigned 32-bit counter per class; signed values start at
                                  ///< counter 32768
-  std::int16_t algoID = VoxelClassificationAlgo_None;
+  std::int16_t algoID = VoxelClassificationAlgo_None;        ///< a `VoxelClassificationAlgo`
   std::int16_t classifiedBy = VoxelClassificationAlgo_None;  ///< what the counters count
-  std::uint32_t selectionLimit = 0;
+  std::uint32_t selectionLimit = 0;                          ///< in voxels; 0: not specified
 
  protected:
   bool ClassifyVoxels();

@@ -88,5 +88,13 @@ std::uint64_t FileSize(std::FILE* file) {
   return AskFacts(file, facts) && facts.st_size > 0 ? static_cast<std::uint64_t>(facts.st_size) : 0;
 }
 
+bool SeekFile(std::FILE* file, std::uint64_t position) {
+#if defined(_WIN32)
+  return _fseeki64(file, static_cast<std::int64_t>(position), SEEK_SET) == 0;
+#else
+  return fseeko(file, static_cast<off_t>(position), SEEK_SET) == 0;
+#endif
+}
+
 }  // namespace vorl_detail
 }  // namespace vorl

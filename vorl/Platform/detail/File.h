@@ -18,6 +18,9 @@ std::FILE* OpenFileForWriting(const char* name);
 /// The size of an open regular file in bytes; 0 when the system does not tell.
 std::uint64_t FileSize(std::FILE* file);
 
+/// Puts the position of an open file at a byte; false when the system refuses.
+bool SeekFile(std::FILE* file, std::uint64_t position);
+
 }  // namespace vorl_detail
 }  // namespace vorl
 

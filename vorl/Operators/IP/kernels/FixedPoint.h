@@ -35,13 +35,12 @@ inline std::int32_t FixedSize(std::int32_t size) {
 }
 
 /// The value times 65536, truncated towards zero. A value that does not fit becomes the nearest one
-/// that does; one that is not a number becomes `notANumber`.
-inline std::int32_t ToFixed(double value, std::int32_t notANumber) {
+/// that does; one that is not a number becomes 0.
+inline std::int32_t ToFixed(double value) {
   constexpr double kLow = std::numeric_limits<std::int32_t>::min();
   constexpr double kHigh = std::numeric_limits<std::int32_t>::max();
   const double scaled = value * 65536.0;
-  return std::isnan(scaled) ? notANumber
-                            : static_cast<std::int32_t>(std::clamp(scaled, kLow, kHigh));
+  return std::isnan(scaled) ? 0 : static_cast<std::int32_t>(std::clamp(scaled, kLow, kHigh));
 }
 
 /// A point or a step in voxel coordinates, 16.16 each.
@@ -50,15 +49,14 @@ struct FixedVector {
   std::int32_t y = 0;
   std::int32_t z = 0;
 
-  /// A step. What is not a number becomes 0, so that a point outside is not carried inside.
-  static FixedVector Step(const dVect3D& vector) {
-    return {ToFixed(vector.x, 0), ToFixed(vector.y, 0), ToFixed(vector.z, 0)};
+  static FixedVector Of(const dVect3D& vector) {
+    return {ToFixed(vector.x), ToFixed(vector.y), ToFixed(vector.z)};
   }
 
-  /// A point. What is not a number becomes a coordinate outside every volume.
-  static FixedVector Point(const dVect3D& vector) {
+  /// A point outside every volume and raster.
+  static FixedVector Outside() {
     constexpr std::int32_t kOutside = std::numeric_limits<std::int32_t>::min();
-    return {ToFixed(vector.x, kOutside), ToFixed(vector.y, kOutside), ToFixed(vector.z, kOutside)};
+    return {kOutside, kOutside, kOutside};
   }
 
   void operator+=(const FixedVector& step) {

@@ -5,8 +5,7 @@
 /// A plane of sampling points in a volume: where it starts and how it is walked.
 
 #include <vorl/Data/dSlice.h>
-#include <vorl/Data/dTrafo.h>
-#include <vorl/Operators/IP/kernels/FixedPoint.h>
+#include <vorl/Operators/IP/kernels/GridProjection.h>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -14,21 +13,20 @@ namespace vorl_detail {
 /// The voxel coordinates of an output slice's pixels, in 16.16.
 struct SlicePlane {
   /// The plane of `slice`, whose pixel (0, 0) is taken at (0, 0, depth) of its coordinate system.
-  SlicePlane(const dSlice& slice, const dCoordSys3D& volume, double depth) {
-    const dTrafo3D toVolume(slice.GetCoordinates(), volume);
-    dVect3D corner;
-    corner.Set(0.0, 0.0, depth);
-    toVolume.pS2T(corner);
-    start = FixedVector::Point(corner);
-    columnStep = FixedVector::Step(toVolume.s2t[0]);
-    rowStep = FixedVector::Step(toVolume.s2t[1]);
-    depthStep = FixedVector::Step(toVolume.s2t[2]);
-  }
+  SlicePlane(const dSlice& slice, const dCoordSys3D& volume, double depth)
+      : SlicePlane(GridProjection(slice.GetCoordinates(), volume, depth)) {}
 
   FixedVector start;
   FixedVector columnStep;  ///< from one pixel of a row to the next
   FixedVector rowStep;     ///< from one row to the next
   FixedVector depthStep;   ///< through one slice thickness
+
+ private:
+  explicit SlicePlane(const GridProjection& toVolume)
+      : start(toVolume.start),
+        columnStep(toVolume.columnX),
+        rowStep(toVolume.columnY),
+        depthStep(toVolume.columnZ) {}
 };
 
 }  // namespace vorl_detail

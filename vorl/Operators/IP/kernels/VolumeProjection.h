@@ -2,12 +2,10 @@
 #define VORL_OPERATORS_IP_KERNELS_VOLUMEPROJECTION_H
 
 /// @file
-/// Voxels and slice pixels carried into the raster of an output slice.
+/// The raster into which voxels and slice pixels are carried, and the walk through a voxel list.
 
-#include <vorl/Data/dTrafo.h>
-#include <vorl/Operators/IP/kernels/FixedPoint.h>
+#include <vorl/Operators/IP/kernels/GridProjection.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
-#include <vorl/Operators/IP/kernels/VoxelList.h>
 
 #include <algorithm>
 #include <cstddef>
@@ -15,32 +13,6 @@
 
 inline namespace vorl {
 namespace vorl_detail {
-
-/// The place of grid points of one coordinate system in another, in 16.16.
-struct GridProjection {
-  GridProjection(const dCoordSys3D& source, const dCoordSys3D& target) {
-    const dTrafo3D toTarget(source, target);
-    dVect3D corner;
-    toTarget.pS2T(corner);
-    start = FixedVector::Point(corner);
-    columnX = FixedVector::Step(toTarget.s2t[0]);
-    columnY = FixedVector::Step(toTarget.s2t[1]);
-    columnZ = FixedVector::Step(toTarget.s2t[2]);
-  }
-
-  FixedVector operator()(const VoxelAddress& voxel) const {
-    FixedVector place = start;
-    place += columnX.Times(voxel.x);
-    place += columnY.Times(voxel.y);
-    place += columnZ.Times(voxel.z);
-    return place;
-  }
-
-  FixedVector start;  ///< of the source's origin
-  FixedVector columnX;
-  FixedVector columnY;
-  FixedVector columnZ;
-};
 
 /// The size of an image's raster in 16.16.
 class RasterBounds {

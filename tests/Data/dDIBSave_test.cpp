@@ -1,0 +1,244 @@
+// Bitmaps in files: saving, and recognising them.
+#include <vorl/Data/dDIB.h>
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <limits>
+#include <string>
+
+#if !defined(_WIN32)
+#include <sys/stat.h>
+#endif
+
+#include "../IO/BinaryFileTest.h"
+#include "../IO/File/BitmapBytes.h"
+#include "../Support/LogRecorder.h"
+#include "DibTesting.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+/// Runs in a folder of its own, which is the current one meanwhile.
+class dDIBSave : public BinaryFileTest {
+ protected:
+  void SetUp() override {
+    m_before = fs::current_path();
+    fs::create_directory(FileName());
+    fs::current_path(FileName());
+  }
+  void TearDown() override { fs::current_path(m_before); }
+
+  fs::path m_before;
+};
+
+class NamedBitmap : public dDIB {
+ public:
+  using dDIB::dDIB;
+  using dDIB::SetFileName;
+};
+
+TEST_F(dDIBSave, WritesWhatIsReadBack) {
+  for (const auto& depth : {std::pair<short, short>{1, 1}, {1, 8}, {3, 8}, {4, 8}}) {
+    dDIB dib(37, 5, depth.first, depth.second);
+    FillWithCount(dib);
+    ASSERT_TRUE(dib.Save("a.bmp", true)) << dib.GetStatus();
+    EXPECT_EQ(dib.GetStatus(), 0);
+    dDIB copy("a.bmp");
+    EXPECT_EQ(copy.GetBitsPerPixel(), dib.GetBitsPerPixel());
+    EXPECT_TRUE(SamePixels(copy, dib)) << dib.GetBitsPerPixel();
+  }
+}
+
+TEST_F(dDIBSave, EightBitFileHasTheRealWidth) {
+  dDIB dib(3, 2, 1, 8);
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  EXPECT_EQ(fs::file_size("a.bmp"), 1078U + 8U);
+  int width = -1;
+  int height = -1;
+  EXPECT_TRUE(dDIB::IsBitmapFile("a.bmp", width, height));
+  EXPECT_EQ(width, 3);
+  EXPECT_EQ(height, 2);
+  EXPECT_EQ(dib.GetHeader()->bmiHeader.biWidth, 4);
+}
+
+TEST_F(dDIBSave, BitmapWithoutPixelsIsNotSaved) {
+  dDIB dib;
+  LogRecorder log;
+  EXPECT_FALSE(dib.Save("a.bmp", true));
+  EXPECT_EQ(StatusText(dib), "dDIB::Save: image is not initialized");
+  EXPECT_EQ(log.errors,
+            std::vector<std::string>{"dDIB::Save: dDIB::Save: image is not initialized"});
+  EXPECT_FALSE(fs::exists("a.bmp"));
+}
+
+TEST_F(dDIBSave, FailureOfTheDescriptorIsTold) {
+  dDIB dib(3, 2, 1, 8);
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  EXPECT_FALSE(dib.Save("a.bmp", false));
+  EXPECT_EQ(StatusText(dib), "dDIB::Save: error:file already exists:'a.bmp'");
+  EXPECT_FALSE(dib.Save("", false));
+  EXPECT_EQ(StatusText(dib), "dDIB::Save: error:NULL parameter:'FilePath'");
+  EXPECT_TRUE(dib.IsValid());
+  EXPECT_TRUE(dib.Save("a.bmp", true));
+}
+
+TEST_F(dDIBSave, UnnamedBitmapsAreNumberedThroughTheProcess) {
+  dDIB dib(3, 2, 1, 8);
+  ASSERT_TRUE(dib.Save(nullptr, false));
+  std::string first;
+  for (const auto& entry : fs::directory_iterator(".")) {
+    first = entry.path().filename().string();
+  }
+  ASSERT_EQ(first.substr(0, 8), "DIBImage");
+  const int number = std::atoi(first.c_str() + 8);
+  EXPECT_GE(number, 1);
+  EXPECT_EQ(first, "DIBImage" + std::to_string(number) + ".bmp");
+  dDIB other(3, 2, 1, 8);
+  ASSERT_TRUE(other.Save(nullptr, false));
+  EXPECT_TRUE(fs::exists("DIBImage" + std::to_string(number + 1) + ".bmp"));
+  ASSERT_TRUE(dib.Save(nullptr, false));
+  EXPECT_TRUE(fs::exists("DIBImage" + std::to_string(number + 2) + ".bmp"));
+}
+
+TEST_F(dDIBSave, BitmapFromAFileIsSavedUnderItsName) {
+  dDIB dib(3, 2, 1, 8);
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  dDIB read("a.bmp");
+  read.Fill(0x33);
+  EXPECT_FALSE(read.Save(nullptr, false));
+  EXPECT_EQ(StatusText(read), "dDIB::Save: error:file already exists:'a.bmp'");
+  ASSERT_TRUE(read.Save(nullptr, true));
+  EXPECT_TRUE(SamePixels(dDIB("a.bmp"), read));
+}
+
+TEST_F(dDIBSave, NameMovesWithTheSection) {
+  NamedBitmap source(3, 2, 1, 8);
+  source.SetFileName("named.bmp");
+  dDIB reference;
+  ASSERT_TRUE(reference.Init(DTM_Reference, source));
+  ASSERT_TRUE(reference.Save(nullptr, false));
+  EXPECT_TRUE(fs::exists("named.bmp"));
+  fs::remove("named.bmp");
+  dDIB target;
+  target <<= source;
+  ASSERT_TRUE(target.Save(nullptr, false));
+  EXPECT_TRUE(fs::exists("named.bmp"));
+  NamedBitmap unnamed(3, 2, 1, 8);
+  unnamed.SetFileName("other.bmp");
+  unnamed.SetFileName(nullptr);
+  ASSERT_TRUE(unnamed.Save(nullptr, false));
+  EXPECT_FALSE(fs::exists("other.bmp"));
+}
+
+TEST_F(dDIBSave, DescendingPaletteIsSaved) {
+  dDIB dib(4, 1, 1, 8);
+  std::memcpy(dib.GetDataPtr(), "\x00\x01\xFE\xFF", 4);
+  ASSERT_TRUE(dib.ResetPalette(false));
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  const dDIB read("a.bmp");
+  EXPECT_EQ(std::memcmp(read.GetDataPtr(), "\xFF\xFE\x01\x00", 4), 0);
+}
+
+class IsBitmapFile : public BinaryFileTest {
+ protected:
+  bool Ask(const char* path) {
+    m_width = -1;
+    m_height = -1;
+    return dDIB::IsBitmapFile(path, m_width, m_height);
+  }
+  void ExpectNot(const char* path) {
+    EXPECT_FALSE(Ask(path));
+    EXPECT_EQ(m_width, 0);
+    EXPECT_EQ(m_height, 0);
+  }
+
+  int m_width;
+  int m_height;
+};
+
+TEST_F(IsBitmapFile, TellsTheSizeWithoutSigns) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = -7;
+  bitmap.height = -5;
+  bitmap.bits = 24;
+  MakeFile(bitmap_test::FileOf(bitmap));
+  EXPECT_TRUE(Ask(FileName()));
+  EXPECT_EQ(m_width, 7);
+  EXPECT_EQ(m_height, 5);
+}
+
+TEST_F(IsBitmapFile, HeadersOfAllKindsTellTheirSize) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = 7;
+  bitmap.height = 5;
+  bitmap.bits = 24;
+  bitmap.infoSize = 124;
+  MakeFile(bitmap_test::FileOf(bitmap));
+  EXPECT_TRUE(Ask(FileName()));
+  EXPECT_EQ(m_width, 7);
+  EXPECT_EQ(m_height, 5);
+  MakeFile(
+      Bytes{'B', 'M', 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 12, 0, 0, 0, 9, 1, 6, 0, 1, 0, 8, 0});
+  EXPECT_TRUE(Ask(FileName()));
+  EXPECT_EQ(m_width, 265);
+  EXPECT_EQ(m_height, 6);
+}
+
+TEST_F(IsBitmapFile, NameMustBeGiven) {
+  LogRecorder log;
+  ExpectNot(nullptr);
+  EXPECT_EQ(log.errors, std::vector<std::string>{"dDIB::IsBitmapFile: missing filename(NULL)"});
+}
+
+TEST_F(IsBitmapFile, FileMustBeOneThatOpens) {
+  LogRecorder log;
+  ExpectNot(FileName());
+  fs::create_directory(FileName());
+  ExpectNot(FileName());
+  const std::string text = std::string("dDIB::IsBitmapFile: can't open '") + FileName() + "'";
+  EXPECT_EQ(log.errors, (std::vector<std::string>{text, text}));
+}
+
+#if !defined(_WIN32)
+TEST_F(IsBitmapFile, PipeIsNotWaitedFor) {
+  ASSERT_EQ(mkfifo(FileName(), 0600), 0);
+  ExpectNot(FileName());
+}
+#endif
+
+class InfoRecorder : public LogTarget {
+ public:
+  InfoRecorder() { GetLogManager().AddLogTarget(this, nullptr); }
+  ~InfoRecorder() override { GetLogManager().RemoveLogTarget(this); }
+  void OnInfo(LogContext* context) override { infos.push_back(context->GetMsg()); }
+  void OnError(LogContext* context) override { errors.push_back(context->GetMsg()); }
+
+  std::vector<std::string> infos;
+  std::vector<std::string> errors;
+};
+
+TEST_F(IsBitmapFile, OtherFilesAreToldAsInformation) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = 7;
+  bitmap.height = 5;
+  bitmap.bits = 24;
+  const auto whole = bitmap_test::FileOf(bitmap);
+  bitmap.width = std::numeric_limits<std::int32_t>::min();
+  bitmap.rows = {0};
+  std::vector<Bytes> files{
+      {}, {'B', 'M'}, {whole.begin(), whole.begin() + 53}, bitmap_test::FileOf(bitmap), whole};
+  files.back()[0] = 'A';
+  for (const Bytes& bytes : files) {
+    MakeFile(bytes);
+    InfoRecorder log;
+    ExpectNot(FileName());
+    EXPECT_EQ(log.infos,
+              std::vector<std::string>{std::string("'") + FileName() + "' is not a bitmap file"});
+    EXPECT_EQ(log.errors, std::vector<std::string>());
+  }
+}
+
+}  // namespace

@@ -1,0 +1,98 @@
+#ifndef VORL_IO_FILE_DETAIL_BITMAPSOURCE_H
+#define VORL_IO_FILE_DETAIL_BITMAPSOURCE_H
+
+/// @file
+/// Where a bitmap to be converted comes from: memory, or a file.
+
+#include <vorl/Common/dStatus.h>
+#include <vorl/Data/detail/BitmapFile.h>
+#include <vorl/Platform/Gdi.h>
+
+#include <array>
+#include <cstdint>
+#include <cstdio>
+#include <memory>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+/// Compression codes beside `BI_RGB`.
+inline constexpr DWORD kCompressionRle8 = 1;
+inline constexpr DWORD kCompressionRle4 = 2;
+inline constexpr DWORD kCompressionBitFields = 3;
+inline constexpr DWORD kCompressionJpeg = 4;
+inline constexpr DWORD kCompressionPng = 5;
+
+/// A bitmap's header and colour table, and its rows one after another as they are stored.
+class BitmapSource {
+ public:
+  virtual ~BitmapSource() = default;
+  BitmapSource(const BitmapSource&) = delete;
+  BitmapSource& operator=(const BitmapSource&) = delete;
+
+  /// Copies the next bytes of the pixels; false when they cannot be had.
+  virtual bool ReadRow(void* target, std::size_t bytes) = 0;
+  /// What to tell when rows are missing.
+  virtual void SetCutOff(dStatus& status) const = 0;
+
+  /// The size of the rows as they are stored.
+  std::uint64_t RowBytes() const;
+  /// The size of all rows; 0 for a depth at which they have none to be converted.
+  std::uint64_t TotalBytes() const;
+  /// Width and height without their signs.
+  std::uint64_t Width() const;
+  std::uint64_t Height() const;
+  bool IsBottomUp() const { return header.biHeight >= 0; }
+  /// True when masks that matter stand behind the header.
+  bool HasMasks() const;
+
+  BITMAPINFOHEADER header{};
+  std::array<tagRGBQUAD, 256> palette{};  ///< black behind the entries that there are
+  unsigned int paletteEntries = 0;        ///< no more than the bits per pixel can name
+  std::array<DWORD, 3> masks{};           ///< of red, green and blue
+  std::uint64_t pixelBytes = 0;           ///< the bytes of pixels that there are
+
+ protected:
+  BitmapSource() = default;
+  /// Takes the palette from what follows the header.
+  void SetPalette(const void* table, std::size_t bytes);
+};
+
+/// A bitmap in memory. Header and colour table are copied.
+class BitmapInMemory : public BitmapSource {
+ public:
+  BitmapInMemory(const tagBITMAPINFO* info, const void* bits);
+
+  bool ReadRow(void* target, std::size_t bytes) override;
+  void SetCutOff(dStatus& status) const override;
+
+ private:
+  const unsigned char* m_bits;
+};
+
+/// A bitmap file.
+class BitmapInFile : public BitmapSource {
+ public:
+  /// Opens the file and reads what comes before the pixels; false with the reason.
+  bool Open(const char* path, dStatus& status);
+
+  bool ReadRow(void* target, std::size_t bytes) override;
+  void SetCutOff(dStatus& status) const override;
+
+ private:
+  struct CloseFile {
+    void operator()(std::FILE* file) const { std::fclose(file); }
+  };
+
+  bool ReadHeaders(dStatus& status);
+  bool Read(void* target, std::size_t bytes);
+
+  RowBuffer m_buffer;
+  std::unique_ptr<std::FILE, CloseFile> m_file;
+  const char* m_path = nullptr;
+};
+
+}  // namespace vorl_detail
+}  // namespace vorl
+
+#endif
