@@ -223,6 +223,33 @@ void Fonts() {
   ReportBool("default", height(0, 400, 0) > 0);
 }
 
+// Lines under and through blanks: both run over the whole text, one below the other.
+void Decorated() {
+  const auto firstRow = [](DWORD underline, DWORD strikeOut) {
+    Section p(60, 60, {8, true});
+    SetBkMode(p.dc, TRANSPARENT);
+    SetTextColor(p.dc, Grey(255));
+    const SelectedObject font(
+        p.dc, CreateFontA(-30, 0, 0, 0, 400, 0, underline, strikeOut, 1, 0, 0, 0, 0, ""));
+    const int width = Measure(p.dc, "  ").width;
+    RECT r{5, 0, 60, 60};
+    DrawTextA(p.dc, "  ", -1, &r, 0);
+    GdiFlush();
+    for (int y = 0; y < 60; ++y) {
+      if (p.Get(5, y) != 0) {
+        ReportBool("whole",
+                   p.Get(4, y) == 0 && p.Get(4 + width, y) != 0 && p.Get(5 + width, y) == 0);
+        return y;
+      }
+    }
+    return -1;
+  };
+  const int under = firstRow(1, 0);
+  const int through = firstRow(0, 1);
+  ReportBool("none", firstRow(0, 0) < 0);
+  ReportBool("below", through > 0 && under > through);
+}
+
 // Text takes no notice of the raster operation.
 void RasterOperation() {
   Box box({24, true});
@@ -257,5 +284,6 @@ void TextScenes() {
   Scene("text/height", [](Random&) { Height(); });
   Scene("text/counts", [](Random&) { Counts(); });
   Scene("text/fonts", [](Random&) { Fonts(); });
+  Scene("text/decorated", [](Random&) { Decorated(); });
   Scene("text/raster-operation", [](Random&) { RasterOperation(); });
 }

@@ -144,11 +144,12 @@ struct LineUnits {
   std::int64_t gap;
   std::int64_t averageWidth;
   std::int64_t strikeOut;  // the middle of the line, above the baseline
+  std::int64_t strikeOutThickness;
 };
 
 LineUnits LineUnitsOf(FT_Face face) {
-  LineUnits units{face->ascender, -std::int64_t{face->descender}, 0, face->units_per_EM / 2,
-                  face->ascender / 3};
+  LineUnits units{face->ascender,     -std::int64_t{face->descender}, 0, face->units_per_EM / 2,
+                  face->ascender / 3, face->underline_thickness};
   const auto* os2 = static_cast<const TT_OS2*>(FT_Get_Sfnt_Table(face, FT_SFNT_OS2));
   if (os2 != nullptr && os2->usWinAscent + os2->usWinDescent > 0) {
     const std::int64_t height = std::int64_t{os2->usWinAscent} + os2->usWinDescent;
@@ -157,6 +158,7 @@ LineUnits LineUnitsOf(FT_Face face) {
     units.descent = os2->usWinDescent;
     units.averageWidth = os2->xAvgCharWidth;
     units.strikeOut = os2->yStrikeoutPosition;
+    units.strikeOutThickness = os2->yStrikeoutSize;
   }
   return units;
 }
@@ -266,10 +268,12 @@ void FontFace::SetMetrics(long pixelSize) {
   m_metrics.descent = scaled(units.descent);
   m_metrics.externalLeading = scaled(units.gap);
   m_metrics.averageWidth = scaled(units.averageWidth);
-  m_metrics.lineThickness = std::max(1, scaled(m_face->underline_thickness));
-  m_metrics.underlineTop =
-      std::max(1, scaled(-std::int64_t{m_face->underline_position}) - m_metrics.lineThickness / 2);
-  m_metrics.strikeOutTop = -scaled(units.strikeOut) - m_metrics.lineThickness / 2;
+  // FreeType has moved the given position to the line's middle; the system takes it as that.
+  const int position = m_face->underline_position + m_face->underline_thickness / 2;
+  m_metrics.underlineThickness = std::max(1, scaled(m_face->underline_thickness));
+  m_metrics.underlineTop = scaled(-position) - m_metrics.underlineThickness / 2;
+  m_metrics.strikeOutThickness = std::max(1, scaled(units.strikeOutThickness));
+  m_metrics.strikeOutTop = -scaled(units.strikeOut) - m_metrics.strikeOutThickness / 2;
 }
 
 FontFace::~FontFace() {

@@ -21,8 +21,9 @@ struct FontMetrics {
   int externalLeading = 0;
   int averageWidth = 0;
   int underlineTop = 0;  ///< from the baseline down
+  int underlineThickness = 1;
   int strikeOutTop = 0;  ///< from the baseline down, negative above it
-  int lineThickness = 1;
+  int strikeOutThickness = 1;
   int Height() const { return ascent + descent; }
 };
 

@@ -52,15 +52,15 @@ void TextPainter::Draw(const TextRun& run, std::int64_t x, std::int64_t top) con
               ink);
     }
   }
-  const auto line = [&](int offset) {
-    FillBox(left, baseline + offset, left + run.width, baseline + offset + metrics.lineThickness,
-            ink);
+  const auto line = [&](int offset, int thickness) {
+    const std::int64_t lineTop = baseline + offset;
+    FillBox(left, lineTop, left + run.width, lineTop + thickness, ink);
   };
   if (description.lfUnderline != 0) {
-    line(metrics.underlineTop);
+    line(metrics.underlineTop, metrics.underlineThickness);
   }
   if (description.lfStrikeOut != 0) {
-    line(metrics.strikeOutTop);
+    line(metrics.strikeOutTop, metrics.strikeOutThickness);
   }
 }
 
