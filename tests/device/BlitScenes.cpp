@@ -74,6 +74,17 @@ void Places(int bits, Random& random) {
   Show(p);
 }
 
+// Negative sizes run from the given corner upwards and to the left, in source and destination.
+void NegativeSizes(int bits, Random& random) {
+  Section a(20, 18, {bits, true});
+  Section p(30, 28, {bits, true});
+  a.Noise(random);
+  BitBlt(p.dc, 12, 11, -10, 8, a.dc, 14, 3, SRCCOPY);
+  BitBlt(p.dc, 15, 12, 11, -9, a.dc, 3, 15, SRCCOPY);
+  BitBlt(p.dc, 25, 26, -20, -13, a.dc, 19, 17, SRCINVERT);
+  Show(p);
+}
+
 void Patterns(int bits, Random& random) {
   Section p(40, 30, {bits, true});
   p.Noise(random);
@@ -123,6 +134,8 @@ void BlitScenes() {
   for (const int bits : {1, 4, 8, 16, 24, 32}) {
     Scene("blt/places-" + std::to_string(bits), [=](Random& random) { Places(bits, random); });
     Scene("blt/patterns-" + std::to_string(bits), [=](Random& random) { Patterns(bits, random); });
+    Scene("blt/negative-sizes-" + std::to_string(bits),
+          [=](Random& random) { NegativeSizes(bits, random); });
   }
   Scene("blt/null-brush", [](Random&) { NullBrush(); });
 }

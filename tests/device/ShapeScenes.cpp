@@ -63,6 +63,23 @@ void PixelColours(Format format) {
   Show(p);
 }
 
+// With exchanged corners, with another raster operation: which of the two heeds it.
+void OddRectangles(int bits) {
+  Section p(24, 20, {bits, true});
+  FillRectangle(p.dc, 9, 8, 3, 1, p.Paint(1));
+  FillRectangle(p.dc, 20, 2, 12, 7, p.Paint(3));
+  FillRectangle(p.dc, 2, 18, 9, 11, p.Paint(5));
+  FillRectangle(p.dc, 12, 12, 12, 18, p.Paint(7));
+  SetROP2(p.dc, R2_XORPEN);
+  FillRectangle(p.dc, 5, 5, 16, 15, p.Paint(9));
+  for (int i = 0; i < 20; ++i) {
+    ReportHex("s", SetPixel(p.dc, i, i, p.Paint(11)));
+  }
+  SetROP2(p.dc, R2_NOT);
+  ReportHex("s", SetPixel(p.dc, 3, 4, p.Paint(13)));
+  Show(p);
+}
+
 // Of one bit: what is neither of the two colours stands out from the background.
 void OneBitColours(bool inverted, std::uint32_t background) {
   Section p(12, 3, {1, true}, inverted);
@@ -97,6 +114,7 @@ void ShapeScenes() {
     Scene("shape/pixel-colours-" + std::to_string(bits), [bits](Random&) {
       PixelColours({bits, bits % 3 != 0});
     });
+    Scene("shape/odd-rectangles-" + std::to_string(bits), [bits](Random&) { OddRectangles(bits); });
   }
   for (const std::uint32_t background : {0xFFFFFFU, 0x404040U, 0x0000FFU}) {
     for (const bool inverted : {false, true}) {

@@ -28,6 +28,7 @@ DeviceContext::DeviceContext(bool isScreen) : Object(kKind), screen(isScreen) {
 }
 
 void DeviceContext::Update() {
+  m_visible = Region();  // if memory runs out below, nothing can be drawn on
   m_surface = state.bitmap->surface;
   if (screen) {
     m_surface = Surface{};

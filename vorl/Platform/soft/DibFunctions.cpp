@@ -95,13 +95,13 @@ int StretchDIBits(HDC dc, int x, int y, int width, int height, int sourceX, int 
     const std::int64_t top = std::int64_t{layout->height} - sourceY - sourceHeight;
     const Axis columns{x, width, sourceX, sourceWidth};
     const Axis rows{y, height, top, sourceHeight};
-    if (!UsesSource(rop)) {
-      FillByRop(*context, columns, rows, rop);
-      return layout->height;
-    }
     if (!TouchesSource(columns, layout->width) || !TouchesSource(rows, layout->height)) {
       SetError(ERROR_INVALID_PARAMETER);
       return 0;
+    }
+    if (!UsesSource(rop)) {
+      FillByRop(*context, columns, rows, rop);
+      return layout->height;
     }
     BlitSource source;
     source.surface = layout->Over(static_cast<std::uint8_t*>(const_cast<void*>(bits)));

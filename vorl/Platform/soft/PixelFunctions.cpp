@@ -7,11 +7,23 @@ using vorl::vorl_detail::DeviceContext;
 using vorl::vorl_detail::Find;
 using vorl::vorl_detail::Guarded;
 using vorl::vorl_detail::NearestPixel;
+using vorl::vorl_detail::Ordered;
 using vorl::vorl_detail::Painter;
 using vorl::vorl_detail::ReadPixel;
+using vorl::vorl_detail::Rop2Operation;
 using vorl::vorl_detail::SetError;
 using vorl::vorl_detail::Surface;
-using vorl::vorl_detail::WritePixel;
+
+namespace {
+
+// Rectangles with exchanged corners cover as many pixels, with the first corner included.
+RECT Covered(const RECT& rect) {
+  const std::int64_t dx = rect.right < rect.left ? 1 : 0;
+  const std::int64_t dy = rect.bottom < rect.top ? 1 : 0;
+  return Ordered(rect.left + dx, rect.top + dy, rect.right + dx, rect.bottom + dy);
+}
+
+}  // namespace
 
 COLORREF SetPixel(HDC dc, int x, int y, COLORREF colour) {
   return Guarded(CLR_INVALID, [&] {
@@ -21,7 +33,7 @@ COLORREF SetPixel(HDC dc, int x, int y, COLORREF colour) {
     }
     const Surface& target = context->Target();
     const std::uint32_t pixel = NearestPixel(target.format, colour);
-    WritePixel(target.Row(y), x, target.format.depth, pixel);
+    Painter(*context, Rop2Operation(context->state.rop2, pixel)).Point(x, y);
     return ColourOf(target.format, pixel);
   });
 }
@@ -50,7 +62,7 @@ int FillRect(HDC dc, const RECT* rect, HBRUSH brush) {
     }
     if (chosen->style != BS_NULL) {
       // Always a copy: the raster operation of the context is for pens and shapes.
-      Painter(*context, BitOperation{0, context->PixelOf(chosen->colour)}).Fill(*rect);
+      Painter(*context, BitOperation{0, context->PixelOf(chosen->colour)}).Fill(Covered(*rect));
     }
     return 1;
   });
