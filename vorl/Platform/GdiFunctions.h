@@ -61,8 +61,12 @@ VORL_API HBRUSH CreateSolidBrush(COLORREF colour);
 /// A pen. Wider than one pixel it is solid whatever its style. Null for a style that does not exist
 /// (those above PS_INSIDEFRAME become PS_SOLID) or when memory or handles are exhausted.
 VORL_API HPEN CreatePen(int style, int width, COLORREF colour);
-/// A font. A positive `height` is that of a line, a negative one that of the characters; 0 takes a
-/// default. A null or unknown `face` takes a sans-serif one. Null when memory is exhausted.
+/// A font. A positive `height` is that of a line: the largest font that fits is taken; a negative
+/// one is that of the characters; 0 takes a default of 16 for the line. Fonts above 4096 pixels are
+/// drawn in that size. `width` is the average character's, 0 for the font's own. A null or unknown
+/// `face` takes the font that comes nearest, in the family that `pitchAndFamily` names. Text always
+/// runs from left to right: `escapement` and `orientation` are kept but have no effect. Null when
+/// memory is exhausted.
 VORL_API HFONT CreateFontA(int height, int width, int escapement, int orientation, int weight,
                            DWORD italic, DWORD underline, DWORD strikeOut, DWORD charSet,
                            DWORD outPrecision, DWORD clipPrecision, DWORD quality,
@@ -146,7 +150,12 @@ VORL_API COLORREF GetPixel(HDC dc, int x, int y);
 // ---- Text and colours ----
 
 /// Draws, or with DT_CALCRECT measures, UTF-8 text inside a rectangle. `count` is its length in
-/// bytes, -1 for text that ends with a zero. Returns the height of the text, 0 on failure.
+/// bytes, negative for text that ends with a zero. Bytes that are no UTF-8 are shown as U+FFFD.
+/// The text takes the text colour and, with the mode OPAQUE, the background colour; it takes no
+/// notice of the raster operation. Measuring moves the right and lower sides of `rect` only.
+/// Returns the height from the top of `rect` to the end of the text, 0 on failure; lines that begin
+/// below `rect` count with DT_NOCLIP and DT_CALCRECT only. Where no font is installed text has no
+/// size, nothing is drawn, and the result is 0.
 VORL_API int DrawTextA(HDC dc, LPCSTR text, int count, LPRECT rect, UINT format);
 /// Sets the text colour; returns the one before, CLR_INVALID on failure.
 VORL_API COLORREF SetTextColor(HDC dc, COLORREF colour);

@@ -17,6 +17,17 @@
 #include <string>
 #include <utility>
 
+#if defined(__SANITIZE_ADDRESS__)
+#define VORL_LEAK_SANITIZER
+#elif defined(__has_feature)
+#if __has_feature(address_sanitizer)
+#define VORL_LEAK_SANITIZER
+#endif
+#endif
+#if defined(VORL_LEAK_SANITIZER)
+#include <sanitizer/lsan_interface.h>
+#endif
+
 inline namespace vorl {
 namespace vorl_detail {
 
@@ -42,9 +53,28 @@ FT_Library Library() {
   return library;
 }
 
+// Fontconfig keeps addresses in forms in which the search for leaks does not find them.
+struct LeaksIgnored {
+#if defined(VORL_LEAK_SANITIZER)
+  LeaksIgnored() {
+    __lsan_disable();
+  }
+  ~LeaksIgnored() {
+    __lsan_enable();
+  }
+#else
+  LeaksIgnored() {}
+#endif
+  LeaksIgnored(const LeaksIgnored&) = delete;
+  LeaksIgnored& operator=(const LeaksIgnored&) = delete;
+};
+
 // Fontconfig's configuration, made once for the process.
 FcConfig* FontConfiguration() {
-  static FcConfig* const configuration = FcInitLoadConfigAndFonts();
+  static FcConfig* const configuration = [] {
+    const LeaksIgnored ignored;
+    return FcInitLoadConfigAndFonts();
+  }();
   return configuration;
 }
 

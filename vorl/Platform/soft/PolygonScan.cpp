@@ -50,14 +50,10 @@ std::vector<Edge> VisibleEdges(std::span<const GridPoint> corners, const RECT& b
   return edges;
 }
 
-// The order changes little from one row to the next, which insertion sort takes advantage of.
+// Between edges that cross at the same column nothing is filled: their order does not matter.
 void SortByColumn(std::vector<Edge>& active) {
-  for (auto edge = active.begin(); edge != active.end(); ++edge) {
-    const auto place =
-        std::upper_bound(active.begin(), edge, *edge,
-                         [](const Edge& a, const Edge& b) { return a.Column() < b.Column(); });
-    std::rotate(place, edge, edge + 1);
-  }
+  std::sort(active.begin(), active.end(),
+            [](const Edge& a, const Edge& b) { return a.Column() < b.Column(); });
 }
 
 void FillRow(std::vector<Span>& spans, const std::vector<Edge>& active, std::int64_t row,
