@@ -87,7 +87,7 @@ void DrawAll(Canvas& canvas) {
 TEST(vIma2DevicePicture, IsTheOneThatWasLookedAt) {
   Canvas canvas(240, 160);
   DrawAll(canvas);
-  const std::string path = std::string(VORL_REFERENCE_PICTURES) + "/vIma2Device.bmp";
+  const std::string path = VORL_REFERENCE_PICTURES "/vIma2Device.bmp";
   if (std::getenv("VORL_UPDATE_PICTURES") != nullptr) {
     ASSERT_TRUE(canvas.Bitmap().Save(path.c_str(), true)) << canvas.Bitmap().GetStatus();
   }

@@ -81,11 +81,12 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
 #pragma GCC diagnostic pop
 #endif
   /// Takes over the format and the pixels of `source`: `DTM_Copy` copies the pixels,
-  /// `DTM_TakeOver` moves them and resets the source, `DTM_Reference` refers to them without owning
-  /// them. The same object: nothing changes. A source that refers to this image's own pixels, which
-  /// end here, is copied in every mode. Any other mode takes the format without the pixels. Returns
-  /// whether the image is valid; when there is no memory for a copy the image is reset ("no
-  /// memory(%d bytes required)").
+  /// `DTM_TakeOver` moves them and resets the source (pixels that end with the source, such as
+  /// those of a `dDIB`, are copied), `DTM_Reference` refers to them without owning them. The same
+  /// object: nothing changes. A source that refers to this image's own pixels, which end here, is
+  /// copied in every mode. Any other mode takes the format without the pixels. Returns whether the
+  /// image is valid; when there is no memory for a copy the image is reset ("no memory(%d bytes
+  /// required)").
   virtual bool Init(DataTransferMode mode, dImage& source);
   /// Formats the image.
   ///

@@ -210,9 +210,9 @@ bool vIma2Device::Draw(HDC dc) {
   if (imageHeight < 0) {
     // The device counts rows from the bottom: mirrored twice, the picture is upright.
     sourceY = ToDevice(std::int64_t{1} - imageHeight - sourceY);
-    sourceHeight = ToDevice(-std::int64_t{sourceHeight});
+    sourceHeight = -sourceHeight;
     targetY = ToDevice(std::int64_t{targetY} + targetHeight - 1);
-    targetHeight = ToDevice(-std::int64_t{targetHeight});
+    targetHeight = -targetHeight;
   }
   SetStretchBltMode(dc, COLORONCOLOR);
   return StretchDIBits(dc, m_targetRect.left, targetY, WidthOf(m_targetRect), targetHeight,
@@ -252,7 +252,7 @@ bool vIma2Device::EraseBackground(HDC dc, const tagRECT* region, const tagRECT* 
   const HBRUSH brush = CreateSolidBrush(static_cast<COLORREF>(colour));
   const bool filled = FillParts(dc, *region, excluded != nullptr ? *excluded : tagRECT{}, brush);
   DeleteObject(brush);
-  return filled;
+  return dc != nullptr && filled;  // not every device refuses to fill none
 }
 
 bool vIma2Device::EraseBackground(HDC dc, const tagRECT* region, unsigned long colour,

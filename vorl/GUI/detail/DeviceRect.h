@@ -19,14 +19,19 @@ inline int ToDevice(std::int64_t value) {
                                                    std::numeric_limits<int>::max()));
 }
 
-/// The way from the left to the right edge; negative where they are swapped.
-inline int WidthOf(const tagRECT& rect) {
-  return ToDevice(std::int64_t{rect.right} - rect.left);
+/// The way from one edge to the other; negative where they are swapped. It can be mirrored: the
+/// lowest number, whose opposite is none, is left out. Devices have been seen to divide by zero
+/// when they are given it.
+inline int ExtentOf(std::int64_t from, std::int64_t to) {
+  return std::max(ToDevice(to - from), -std::numeric_limits<int>::max());
 }
 
-/// The way from the top to the bottom edge; negative where they are swapped.
+inline int WidthOf(const tagRECT& rect) {
+  return ExtentOf(rect.left, rect.right);
+}
+
 inline int HeightOf(const tagRECT& rect) {
-  return ToDevice(std::int64_t{rect.bottom} - rect.top);
+  return ExtentOf(rect.top, rect.bottom);
 }
 
 }  // namespace vorl_detail

@@ -51,6 +51,18 @@ void ApplyToBits(std::uint8_t* row, std::int64_t begin, std::int64_t end, std::u
   }
 }
 
+// Writes a pixel once and copies what is there, twice as much each time.
+void FillWith(std::uint8_t* pixels, std::size_t bytes, const std::uint8_t* pixel,
+              std::size_t pixelBytes) {
+  if (bytes == 0) {
+    return;
+  }
+  std::memcpy(pixels, pixel, pixelBytes);
+  for (std::size_t done = pixelBytes; done < bytes; done *= 2) {
+    std::memcpy(pixels + done, pixels, std::min(done, bytes - done));
+  }
+}
+
 // Pixels of several bytes.
 template <int kBytes>
 void ApplyToBytes(std::uint8_t* pixels, std::int64_t count, BitOperation operation) {
@@ -59,6 +71,10 @@ void ApplyToBytes(std::uint8_t* pixels, std::int64_t count, BitOperation operati
   for (unsigned i = 0; i < kBytes; ++i) {
     keep[i] = static_cast<std::uint8_t>(operation.keep >> (8 * i));
     flip[i] = static_cast<std::uint8_t>(operation.flip >> (8 * i));
+  }
+  if (std::all_of(keep, keep + kBytes, [](std::uint8_t mask) { return mask == 0; })) {
+    FillWith(pixels, static_cast<std::size_t>(count) * kBytes, flip, kBytes);
+    return;
   }
   for (std::int64_t x = 0; x < count; ++x, pixels += kBytes) {
     for (int i = 0; i < kBytes; ++i) {

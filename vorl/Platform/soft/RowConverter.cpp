@@ -25,6 +25,55 @@ void Store(std::uint8_t* unit, std::uint32_t pixel) {
   }
 }
 
+// The units of a byte, for each value that it can have.
+template <int kDepth>
+constexpr auto MakeUnitsOfByte() {
+  constexpr unsigned kCount = 8 / kDepth;
+  std::array<std::array<std::uint8_t, kCount>, 256> table{};
+  for (unsigned byte = 0; byte < 256; ++byte) {
+    for (unsigned i = 0; i < kCount; ++i) {
+      table[byte][i] = byte >> (8 - kDepth * (i + 1)) & ((1U << kDepth) - 1U);
+    }
+  }
+  return table;
+}
+
+// Whole bytes at once, what is before and behind them pixel by pixel.
+template <int kDepth>
+void UnpackSmall(const std::uint8_t* row, int x, int count, std::uint8_t* units) {
+  static constexpr auto kUnits = MakeUnitsOfByte<kDepth>();
+  constexpr int kPerByte = 8 / kDepth;
+  int i = 0;
+  for (; i < count && (x + i) % kPerByte != 0; ++i) {
+    units[i] = static_cast<std::uint8_t>(ReadPixel(row, x + i, kDepth));
+  }
+  for (; count - i >= kPerByte; i += kPerByte) {
+    std::memcpy(units + i, kUnits[row[(x + i) / kPerByte]].data(), kPerByte);
+  }
+  for (; i < count; ++i) {
+    units[i] = static_cast<std::uint8_t>(ReadPixel(row, x + i, kDepth));
+  }
+}
+
+template <int kDepth>
+void PackSmall(std::uint8_t* row, int x, int count, const std::uint8_t* units) {
+  constexpr int kPerByte = 8 / kDepth;
+  int i = 0;
+  for (; i < count && (x + i) % kPerByte != 0; ++i) {
+    WritePixel(row, x + i, kDepth, units[i]);
+  }
+  for (; count - i >= kPerByte; i += kPerByte) {
+    unsigned byte = 0;
+    for (int k = 0; k < kPerByte; ++k) {
+      byte = byte << kDepth | (units[i + k] & ((1U << kDepth) - 1U));
+    }
+    row[(x + i) / kPerByte] = static_cast<std::uint8_t>(byte);
+  }
+  for (; i < count; ++i) {
+    WritePixel(row, x + i, kDepth, units[i]);
+  }
+}
+
 }  // namespace
 
 void UnpackRow(const std::uint8_t* row, int depth, int x, int count, std::uint8_t* units) {
@@ -34,9 +83,7 @@ void UnpackRow(const std::uint8_t* row, int depth, int x, int count, std::uint8_
                 static_cast<std::size_t>(count) * static_cast<std::size_t>(bytes));
     return;
   }
-  for (int i = 0; i < count; ++i) {
-    units[i] = static_cast<std::uint8_t>(ReadPixel(row, x + i, depth));
-  }
+  return depth == 1 ? UnpackSmall<1>(row, x, count, units) : UnpackSmall<4>(row, x, count, units);
 }
 
 void PackRow(std::uint8_t* row, int depth, int x, int count, const std::uint8_t* units) {
@@ -46,9 +93,7 @@ void PackRow(std::uint8_t* row, int depth, int x, int count, const std::uint8_t*
                 static_cast<std::size_t>(count) * static_cast<std::size_t>(bytes));
     return;
   }
-  for (int i = 0; i < count; ++i) {
-    WritePixel(row, x + i, depth, units[i]);
-  }
+  return depth == 1 ? PackSmall<1>(row, x, count, units) : PackSmall<4>(row, x, count, units);
 }
 
 RowConverter::RowConverter(const PixelFormat& source, const PixelFormat& target,
