@@ -135,9 +135,29 @@ void BeyondTheMemory(Format format) {
   Show(p);
 }
 
+// Pictures of all small widths and heights, each stretched to one column and to one row.
+void ToOne(bool topDown, int mode, Random& random) {
+  Section a(16, 16, {24, topDown});
+  Section p(40, 40, {24, true});
+  a.Noise(random);
+  SetStretchBltMode(p.dc, mode);
+  for (int size = 1; size <= 12; ++size) {
+    StretchBlt(p.dc, size, 0, 1, 6, a.dc, 2, 1, size, 6, SRCCOPY);
+    StretchBlt(p.dc, 0, 12 + size, 6, 1, a.dc, 1, 2, 6, size, SRCCOPY);
+    StretchBlt(p.dc, 14 + size, 5, 1, -6, a.dc, 2, 1, size, 6, SRCCOPY);
+    StretchBlt(p.dc, 20, 12 + size, -6, 1, a.dc, 1, 2, 6, size, SRCCOPY);
+    StretchDIBits(p.dc, 20 + size, 30, 1, 6, 2, 1, size, 6, a.pixels, a.Info(), 0, SRCCOPY);
+  }
+  Show(p);
+}
+
 }  // namespace
 
 void StretchScenes() {
+  for (int i = 0; i < 6; ++i) {
+    Scene("stretch/to-one-" + std::to_string(i),
+          [=](Random& random) { ToOne(i % 2 == 0, 1 + i / 2, random); });
+  }
   const char* const kinds[] = {"-larger", "-smaller", "-mirrored"};
   for (int mode = BLACKONWHITE; mode <= COLORONCOLOR; ++mode) {
     for (const Kind kind : {kLarger, kSmaller, kMirrored}) {

@@ -13,6 +13,12 @@ using vorl::vorl_detail::UsesSource;
 
 namespace {
 
+// Stretched to a single column or row, a picture goes without its last one, as the system has it.
+Axis StretchAxis(int target, int targetLength, int source, int sourceLength) {
+  const bool toOne = targetLength == 1 && sourceLength > 1;
+  return Axis{target, targetLength, source, toOne ? sourceLength - 1 : sourceLength};
+}
+
 BOOL BlitBetween(HDC dc, const Axis& x, const Axis& y, HDC source, DWORD rop) {
   return Guarded(FALSE, [&]() -> BOOL {
     const auto context = Find<DeviceContext>(dc);
@@ -50,6 +56,6 @@ BOOL PatBlt(HDC dc, int x, int y, int width, int height, DWORD rop) {
 
 BOOL StretchBlt(HDC dc, int x, int y, int width, int height, HDC source, int sourceX, int sourceY,
                 int sourceWidth, int sourceHeight, DWORD rop) {
-  return BlitBetween(dc, Axis{x, width, sourceX, sourceWidth},
-                     Axis{y, height, sourceY, sourceHeight}, source, rop);
+  return BlitBetween(dc, StretchAxis(x, width, sourceX, sourceWidth),
+                     StretchAxis(y, height, sourceY, sourceHeight), source, rop);
 }
