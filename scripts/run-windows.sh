@@ -25,4 +25,13 @@ done
 export WINEPREFIX="${WINEPREFIX:-$project/build/windows-deps/wine}"
 export WINEDEBUG="${WINEDEBUG:--all}"
 export WINEPATH="$folders${WINEPATH:-}"
-exec "$wine" "$@"
+
+# Wine leaves processes of its own behind, which hold on to the output of the program that started
+# them; whoever reads that output to its end would wait for them. So they get a file instead.
+output="$(mktemp -d)"
+trap 'rm -rf "$output"' EXIT
+result=0
+"$wine" "$@" >"$output/out" 2>"$output/err" || result=$?
+cat "$output/out"
+cat "$output/err" >&2
+exit "$result"
