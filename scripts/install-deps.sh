@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the packages that the project needs and this machine lacks (Debian and relatives).
 #
-#   scripts/install-deps.sh [GROUP...]     groups: build test check tidy coverage;
+#   scripts/install-deps.sh [GROUP...]     groups: build test check tidy coverage windows;
 #                                          without any: all
 #
 # Asks the package database first: when nothing is missing, nothing is downloaded and no rights are
@@ -29,6 +29,11 @@ test     libgtest-dev       the tests
 check    clang-format       the format check; version 14 decides
 tidy     clang-tidy         static analysis
 coverage gcovr              the line coverage report
+windows  dpkg-dev           unpacks the sources of what the target lacks
+windows  g++-mingw-w64-x86-64-posix  the compiler for Windows
+windows  googletest         the sources of GoogleTest
+windows  libz-mingw-w64-dev  zlib for Windows
+windows  wine64             runs programs for Windows
 '
 
 die() {
@@ -38,8 +43,8 @@ die() {
 
 for group in "$@"; do
   case "$group" in
-    build | test | check | tidy | coverage) ;;
-    *) die "unknown group '$group' (build, test, check, tidy, coverage)" ;;
+    build | test | check | tidy | coverage | windows) ;;
+    *) die "unknown group '$group' (build, test, check, tidy, coverage, windows)" ;;
   esac
 done
 

@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# Installs what is missing, builds everything and runs every test.
+# Installs what is missing, builds everything and runs every test, here and for Windows.
 #
 #   scripts/test.sh
 . "$(dirname "${BASH_SOURCE[0]}")/common.sh"
@@ -9,4 +9,5 @@ scripts/install-deps.sh build test
 configure release
 build release
 run_tests release
+scripts/test-windows.sh
 step 'All tests passed'

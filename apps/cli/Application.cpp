@@ -40,6 +40,7 @@ Commands DeclareCommands(CLI::App& app) {
   app.set_help_flag("-h,--help", "Print this help and exit")->group(kGeneralGroup);
   app.set_version_flag("--version", "vorl " VORL_VERSION, "Print the version and exit")
       ->group(kGeneralGroup);
+  app.allow_windows_style_options(false);  // names of inputs begin with a slash, too
   app.require_subcommand(0, 1);
   Commands commands;
   commands.push_back(MakeInfoCommand(app));

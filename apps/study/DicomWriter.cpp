@@ -156,13 +156,14 @@ void PutPixels(DcmItem& item, const Series& series, const dSlice& slice, int ind
     Put(item, DCM_WindowCenter, Decimal(series.study.windowCentre));
     Put(item, DCM_WindowWidth, Decimal(series.study.windowWidth));
   }
+  // Width and height of a slice have 16 bits each.
+  const auto count = static_cast<unsigned long>(packed.samples.size());
   OFCondition condition;
   if (format.bitsAllocated == 8) {
     const std::vector<Uint8> bytes(packed.samples.begin(), packed.samples.end());
-    condition = item.putAndInsertUint8Array(DCM_PixelData, bytes.data(), bytes.size());
+    condition = item.putAndInsertUint8Array(DCM_PixelData, bytes.data(), count);
   } else {
-    condition =
-        item.putAndInsertUint16Array(DCM_PixelData, packed.samples.data(), packed.samples.size());
+    condition = item.putAndInsertUint16Array(DCM_PixelData, packed.samples.data(), count);
   }
   if (condition.bad()) {
     throw Error(std::string("the pixels can't be stored (") + condition.text() + ")");

@@ -9,6 +9,8 @@
 #include <system_error>
 
 #ifdef _WIN32
+#include <fcntl.h>
+#include <io.h>
 #include <process.h>
 #else
 #include <fcntl.h>
@@ -20,35 +22,53 @@ namespace {
 
 namespace fs = std::filesystem;
 
+#ifdef _WIN32
+int ProcessId() {
+  return _getpid();
+}
+int OpenToFlush(const fs::path& path) {
+  return _wopen(path.c_str(), _O_RDWR | _O_BINARY | _O_NOINHERIT);
+}
+int Flush(int file) {
+  return _commit(file);
+}
+void Close(int file) {
+  _close(file);
+}
+#else
+int ProcessId() {
+  return getpid();
+}
+int OpenToFlush(const fs::path& path) {
+  return open(path.c_str(), O_RDONLY | O_CLOEXEC);
+}
+int Flush(int file) {
+  return fsync(file);
+}
+void Close(int file) {
+  close(file);
+}
+#endif
+
 /// Differs between processes and between the files of one process.
 std::string UniqueSuffix() {
   static std::atomic<unsigned> count{0};
-#ifdef _WIN32
-  const int process = _getpid();
-#else
-  const int process = getpid();
-#endif
-  return ".part-" + std::to_string(process) + "-" + std::to_string(++count);
+  return ".part-" + std::to_string(ProcessId()) + "-" + std::to_string(++count);
 }
 
 /// Makes sure that the bytes have reached the disk: with delayed allocation a full disk shows no
 /// earlier than here.
 void FlushToDisk(const fs::path& path, const fs::path& target) {
-#ifndef _WIN32
-  const int file = open(path.c_str(), O_RDONLY | O_CLOEXEC);
+  const int file = OpenToFlush(path);
   const bool opened = file >= 0;
-  const bool flushed = opened && fsync(file) == 0;
+  const bool flushed = opened && Flush(file) == 0;
   const int reason = errno;
   if (opened) {
-    close(file);
+    Close(file);
   }
   if (!flushed) {
     throw Error("can't write " + Quoted(target.string()) + ": " + std::strerror(reason));
   }
-#else
-  (void)path;
-  (void)target;
-#endif
 }
 
 }  // namespace

@@ -18,6 +18,13 @@ using std::chrono::microseconds;
 using std::chrono::milliseconds;
 using vorl_detail::Thread;
 
+// Looks again and again: not every standard library's atomics wake up all who wait.
+void WaitFor(const std::atomic<bool>& flag) {
+  while (!flag) {
+    std::this_thread::sleep_for(milliseconds(1));
+  }
+}
+
 TEST(LogThreadKill, LogStackStaysUsable) {
   std::mt19937 random(24680);
   for (int round = 0; round < 300; ++round) {
@@ -51,13 +58,12 @@ void KillWhileStoring(Store store) {
   const auto thread = Thread::Start([&] {
     const AllocationDelay delay(60);
     storing = true;
-    storing.notify_one();
     store();
     while (true) {
       std::this_thread::sleep_for(milliseconds(1));
     }
   });
-  storing.wait(false);
+  WaitFor(storing);
   std::this_thread::sleep_for(milliseconds(20));
   thread->Kill();
   thread->Join();

@@ -165,10 +165,10 @@ TEST(dRect, UnionWithAnEmptyRectangleAddsNothing) {
 }
 
 TEST(dRect, EdgesBeyondTheLargestPositionCount) {
-  const dRect far(kMax - 1, kMax - 1, 10, 10);
-  EXPECT_TRUE(Is(far & dRect(0, 0, kLargestSize, kLargestSize), far));
-  EXPECT_TRUE(Is(far & dRect(kMax, kMax, 3, 20), kMax, kMax, 3, 9));
-  EXPECT_TRUE(Is(far | dRect(kMax, kMax, 20, 1), kMax - 1, kMax - 1, 21, 10));
+  const dRect corner(kMax - 1, kMax - 1, 10, 10);
+  EXPECT_TRUE(Is(corner & dRect(0, 0, kLargestSize, kLargestSize), corner));
+  EXPECT_TRUE(Is(corner & dRect(kMax, kMax, 3, 20), kMax, kMax, 3, 9));
+  EXPECT_TRUE(Is(corner | dRect(kMax, kMax, 20, 1), kMax - 1, kMax - 1, 21, 10));
   EXPECT_TRUE(
       Is(dRect(kMin, kMin, kLargestSize, 1) & dRect(kMax - 1, kMin, 9, 9), kMax - 1, kMin, 1, 1));
 }

@@ -17,6 +17,13 @@ using std::chrono::milliseconds;
 using vorl_detail::KillShield;
 using vorl_detail::Thread;
 
+// Looks again and again: not every standard library's atomics wake up all who wait.
+void WaitFor(const std::atomic<bool>& flag) {
+  while (!flag) {
+    std::this_thread::sleep_for(milliseconds(1));
+  }
+}
+
 TEST(KillShield, PutsOffTheEndUntilItIsGone) {
   std::atomic<bool> shielded{false};
   std::atomic<bool> finished{false};
@@ -24,7 +31,6 @@ TEST(KillShield, PutsOffTheEndUntilItIsGone) {
     {
       const KillShield shield;
       shielded = true;
-      shielded.notify_one();
       std::this_thread::sleep_for(milliseconds(60));
       finished = true;
     }
@@ -32,7 +38,7 @@ TEST(KillShield, PutsOffTheEndUntilItIsGone) {
       std::this_thread::sleep_for(milliseconds(1));
     }
   });
-  shielded.wait(false);
+  WaitFor(shielded);
   thread->Kill();
   thread->Join();
   EXPECT_TRUE(finished);
@@ -46,7 +52,6 @@ TEST(KillShield, Nests) {
       const KillShield outer;
       { const KillShield inner; }
       shielded = true;
-      shielded.notify_one();
       std::this_thread::sleep_for(milliseconds(60));
       finished = true;
     }
@@ -54,7 +59,7 @@ TEST(KillShield, Nests) {
       std::this_thread::sleep_for(milliseconds(1));
     }
   });
-  shielded.wait(false);
+  WaitFor(shielded);
   thread->Kill();
   thread->Join();
   EXPECT_TRUE(finished);

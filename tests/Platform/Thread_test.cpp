@@ -22,6 +22,13 @@ void Sleep(int count) {
   std::this_thread::sleep_for(milliseconds(count));
 }
 
+// Looks again and again: not every standard library's atomics wake up all who wait.
+void WaitFor(const std::atomic<bool>& flag) {
+  while (!flag) {
+    std::this_thread::sleep_for(milliseconds(1));
+  }
+}
+
 [[noreturn]] void SleepForEver() {
   while (true) {
     Sleep(1);
@@ -41,11 +48,12 @@ TEST(Thread, IsCurrentOnlyInItself) {
   std::atomic<Thread*> self{nullptr};
   bool inside = false;
   const auto thread = Thread::Start([&] {
-    self.wait(nullptr);
+    while (self == nullptr) {
+      Sleep(1);
+    }
     inside = self.load()->IsCurrent();
   });
   self = thread.get();
-  self.notify_one();
   EXPECT_FALSE(thread->IsCurrent());
   thread->Join();
   EXPECT_TRUE(inside);
@@ -63,11 +71,10 @@ TEST(Thread, EndedThreadIsNotCurrentInItsSuccessor) {
 
 TEST(Thread, WaitsForTheEndOfTheBody) {
   std::atomic<bool> release{false};
-  const auto thread = Thread::Start([&] { release.wait(false); });
+  const auto thread = Thread::Start([&] { WaitFor(release); });
   EXPECT_FALSE(thread->WaitFor(milliseconds(0)));
   EXPECT_FALSE(thread->WaitFor(milliseconds(5)));
   release = true;
-  release.notify_one();
   EXPECT_TRUE(thread->WaitFor(milliseconds(30000)));
   EXPECT_TRUE(thread->WaitFor(milliseconds(0)));
 }

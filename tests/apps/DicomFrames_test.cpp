@@ -80,7 +80,8 @@ void WriteFrames(const fs::path& path, bool withGroups, E_TransferSyntax syntax)
   if (withGroups) {
     AddSharedGroups(dataset);
   }
-  dataset.putAndInsertUint16Array(DCM_PixelData, samples.data(), samples.size());
+  dataset.putAndInsertUint16Array(DCM_PixelData, samples.data(),
+                                  static_cast<unsigned long>(samples.size()));
   dataset.chooseRepresentation(syntax, nullptr);
   ASSERT_TRUE(file.saveFile(OFFilename(path.c_str()), syntax).good());
 }
@@ -143,7 +144,8 @@ TEST(DicomFramesDamage, FramesBeyondThePixelsAreRefused) {
   WriteFrames(path, true, EXS_LittleEndianExplicit);
   EditDicom(path, [](DcmDataset& dataset) {
     const std::vector<Uint16> samples(kWidth * kHeight * 2);
-    dataset.putAndInsertUint16Array(DCM_PixelData, samples.data(), samples.size());
+    dataset.putAndInsertUint16Array(DCM_PixelData, samples.data(),
+                                    static_cast<unsigned long>(samples.size()));
   });
   LoadReport report;
   const auto study = LoadDicom({path}, "", report);

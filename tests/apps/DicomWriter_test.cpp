@@ -113,6 +113,7 @@ TEST(DicomWriter, FolderWithContentIsLeftAlone) {
   EXPECT_THAT(folder.Names(), ElementsAre("precious.dcm"));
 }
 
+#if !defined(_WIN32)  // there nothing limits the size of a process's files, and no device is full
 TEST(DicomWriter, FullDiskIsAnErrorAndLeavesNothing) {
   const TestFolder folder;
   const auto study = MakePatternStudy(60, 50, 2);
@@ -124,6 +125,7 @@ TEST(DicomWriter, FullDiskIsAnErrorAndLeavesNothing) {
   }
   EXPECT_THAT(folder.Names(), ElementsAre("good"));
 }
+#endif
 
 TEST(DicomWriter, CancellingRemovesWhatWasWritten) {
   const TestFolder folder;

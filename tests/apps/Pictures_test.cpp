@@ -39,7 +39,7 @@ dImage CountingImage(int width, int height, unsigned short type, const char* cha
 std::string ReadPng(const fs::path& path, png_uint_32 format) {
   png_image png{};
   png.version = PNG_IMAGE_VERSION;
-  if (png_image_begin_read_from_file(&png, path.c_str()) == 0) {
+  if (png_image_begin_read_from_file(&png, path.string().c_str()) == 0) {
     return png.message;
   }
   png.format = format;
@@ -81,7 +81,7 @@ TEST(SavePicture, PngKeepsSixteenBits) {
   EXPECT_EQ(bytes.substr(16, 10), std::string("\0\0\0\2\0\0\0\1\x10\0", 10));
   png_image png{};
   png.version = PNG_IMAGE_VERSION;
-  ASSERT_NE(png_image_begin_read_from_file(&png, (folder / "a.png").c_str()), 0);
+  ASSERT_NE(png_image_begin_read_from_file(&png, (folder / "a.png").string().c_str()), 0);
   EXPECT_NE(png.format & PNG_FORMAT_FLAG_LINEAR, 0u);
   png_image_free(&png);
 }
@@ -138,6 +138,7 @@ TEST(SavePicture, RefusesOtherNamesAndImages) {
   EXPECT_THAT(folder.Names(), IsEmpty());
 }
 
+#if !defined(_WIN32)  // there nothing limits the size of a process's files, and no device is full
 TEST(SavePicture, FullDiskIsAnErrorAndKeepsTheOldFile) {
   const TestFolder folder;
   const dImage image = CountingImage(90, 80, ImageDataType_U8, "G", 1);
@@ -159,5 +160,6 @@ TEST(SavePicture, FullDeviceIsAnError) {
   EXPECT_EQ(ErrorOf([&] { SaveBmp(image, "/dev/full"); }),
             "can't write '/dev/full': No space left on device");
 }
+#endif
 
 }  // namespace

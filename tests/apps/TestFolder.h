@@ -8,11 +8,9 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <stdexcept>
+#include <random>
 #include <string>
 #include <vector>
-
-#include <stdlib.h>
 
 namespace study_test {
 
@@ -22,11 +20,10 @@ namespace fs = std::filesystem;
 class TestFolder {
  public:
   TestFolder() {
-    std::string pattern = (fs::temp_directory_path() / "vorl-test-XXXXXX").string();
-    if (mkdtemp(pattern.data()) == nullptr) {
-      throw std::runtime_error("no folder for the test");
-    }
-    m_path = pattern;
+    std::random_device random;
+    do {
+      m_path = fs::temp_directory_path() / ("vorl-test-" + std::to_string(random()));
+    } while (!fs::create_directory(m_path));  // throws where there can be none
   }
   ~TestFolder() {
     std::error_code ignored;

@@ -58,12 +58,13 @@ expect_output_contains() {
 build_packages='ca-certificates cmake g++ ninja-build fonts-dejavu-core libcli11-dev libdcmtk-dev'
 build_packages+=' libfontconfig-dev libfreetype-dev libpixman-1-dev libpng-dev pkg-config'
 test_packages='libbenchmark-dev libgmock-dev libgtest-dev'
+windows_packages='dpkg-dev g++-mingw-w64-x86-64-posix googletest libz-mingw-w64-dev wine64'
 install='apt-get install -y --no-install-recommends'
 
 NothingMissingTouchesNothing() {
   is_debian
   user_is 1000
-  printf '%s\n' $build_packages $test_packages clang-format clang-tidy gcovr >"$machine/installed"
+  printf '%s\n' $build_packages $test_packages clang-format clang-tidy gcovr $windows_packages >"$machine/installed"
   install_deps
   expect result "$result" 0
   expect calls "$calls" ''
@@ -76,7 +77,7 @@ MissingPackagesAreInstalledInOneGo() {
   install_deps
   expect result "$result" 0
   expect calls "$calls" "apt-get update
-$install clang-format clang-tidy gcovr"
+$install clang-format clang-tidy gcovr $windows_packages"
 }
 
 GroupsLimitWhatIsInstalled() {
@@ -112,7 +113,7 @@ WithoutAptTheListIsPrinted() {
   has_tools
   install_deps
   expect result "$result" 0
-  for package in $build_packages $test_packages clang-format clang-tidy gcovr; do
+  for package in $build_packages $test_packages clang-format clang-tidy gcovr $windows_packages; do
     expect_output_contains "  $package "
   done
   expect_output_contains 'reads DICOM series'

@@ -46,8 +46,8 @@ struct Workbench {
   /// One slice of these samples.
   template <class T>
   Workbench(unsigned short type, unsigned long width, const std::vector<T>& samples) {
-    rasters::AddSlice(volume, {.width = width, .height = samples.size() / width, .type = type},
-                      samples);
+    const auto height = static_cast<unsigned long>(samples.size() / width);
+    rasters::AddSlice(volume, {.width = width, .height = height, .type = type}, samples);
     Connect();
   }
 

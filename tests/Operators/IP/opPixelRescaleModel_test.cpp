@@ -52,7 +52,7 @@ void RescaleDense(const Bytes& source, Bytes& target, std::size_t count, double 
 Bytes Expected(const dImage& source, const Bytes& targetBefore, double factor, double offset) {
   const Bytes from = BytesOf(source);
   Bytes to = targetBefore;
-  const unsigned long channels = std::string(source.GetChannelSequence()).size();
+  const std::size_t channels = std::string(source.GetChannelSequence()).size();
   const std::size_t count = source.GetWidth() * source.GetHeight() * channels;
   switch (source.GetDataType()) {
     case ImageDataType_U8:

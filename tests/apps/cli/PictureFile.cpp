@@ -45,7 +45,8 @@ double Picture::Mean(int x0, int y0, int x1, int y1) const {
 Picture ReadPng(const std::filesystem::path& path) {
   png_image png{};
   png.version = PNG_IMAGE_VERSION;
-  Require(png_image_begin_read_from_file(&png, path.c_str()) != 0, path.string() + " is no PNG");
+  Require(png_image_begin_read_from_file(&png, path.string().c_str()) != 0,
+          path.string() + " is no PNG");
   Require(png.format == PNG_FORMAT_GRAY, "the PNG is not of 8-bit grey");
   Picture picture{static_cast<int>(png.width), static_cast<int>(png.height), {}};
   picture.levels.resize(PNG_IMAGE_SIZE(png));

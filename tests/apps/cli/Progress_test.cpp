@@ -15,6 +15,7 @@ using cli_test::Outcome;
 using cli_test::RunTool;
 using study_test::TestFolder;
 
+#if !defined(_WIN32)  // no pseudo terminal stands in for a person's there
 Conditions Terminal(int columns) {
   Conditions conditions;
   conditions.terminalColumns = columns;
@@ -70,6 +71,7 @@ TEST(Progress, TheBarFitsANarrowTerminal) {
   }
   EXPECT_EQ(longest, 19u);
 }
+#endif
 
 TEST(Progress, APipeGetsNoControlCharacters) {
   const TestFolder folder;
@@ -91,6 +93,7 @@ TEST(Progress, APipeGetsNoControlCharacters) {
   }
 }
 
+#if !defined(_WIN32)  // no pseudo terminal stands in for a person's there
 TEST(Progress, QuietAndDumbTerminalsShowNoBar) {
   const TestFolder folder;
   const Arguments arguments{"phantom", "--size", "48x48x48", (folder / "a.bdf").string()};
@@ -107,5 +110,6 @@ TEST(Progress, ErrorsStandOnALineOfTheirOwn) {
   EXPECT_EQ(outcome.code, 1);
   EXPECT_EQ(Visible(outcome.errors), "vorl: can't write '/dev/full': No space left on device\n");
 }
+#endif
 
 }  // namespace

@@ -4,7 +4,6 @@
 #include <cerrno>
 #include <chrono>
 #include <cstdlib>
-#include <sstream>
 #include <stdexcept>
 
 #include <fcntl.h>
@@ -137,15 +136,6 @@ Outcome RunTool(const Arguments& arguments, const Conditions& conditions) {
   close(output.mine);
   close(errors.mine);
   return outcome;
-}
-
-std::vector<std::string> Lines(const std::string& text) {
-  std::vector<std::string> lines;
-  std::istringstream stream(text);
-  for (std::string line; std::getline(stream, line);) {
-    lines.push_back(line);
-  }
-  return lines;
 }
 
 }  // namespace cli_test

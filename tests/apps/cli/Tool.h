@@ -6,6 +6,7 @@
 
 #include <csignal>
 #include <functional>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -20,7 +21,8 @@ struct Outcome {
   std::string errors;  ///< standard error
 };
 
-/// What a run meets. Without anything else, standard output and error are pipes.
+/// What a run meets. Without anything else, standard output and error are pipes. Windows knows
+/// pipes and files only, and asking for more throws; line ends read as '\n' there too.
 struct Conditions {
   int terminalColumns = 0;             ///< more than 0: a terminal of this width instead of pipes
   std::string terminalKind = "xterm";  ///< TERM on a terminal
@@ -35,7 +37,14 @@ struct Conditions {
 Outcome RunTool(const Arguments& arguments, const Conditions& conditions = {});
 
 /// The lines of a text, without their ends.
-std::vector<std::string> Lines(const std::string& text);
+inline std::vector<std::string> Lines(const std::string& text) {
+  std::vector<std::string> lines;
+  std::istringstream stream(text);
+  for (std::string line; std::getline(stream, line);) {
+    lines.push_back(line);
+  }
+  return lines;
+}
 
 }  // namespace cli_test
 

@@ -25,12 +25,16 @@ std::shared_ptr<OperatorThread> OperatorThread::Start(OpBase& owner) {
 }
 
 void OperatorThread::Publish() {
+  const std::lock_guard lock(m_mutex);
   m_published = true;
-  m_published.notify_one();
+  m_changed.notify_one();
 }
 
 void OperatorThread::Body() {
-  m_published.wait(false);
+  {
+    std::unique_lock lock(m_mutex);
+    m_changed.wait(lock, [this] { return m_published; });
+  }
   const bool ok = m_owner.Run();
   // After a run that came to `Start` the owner may already be in its next one.
   if (m_owner.m_launching.exchange(false)) {

@@ -2,7 +2,9 @@
 #define VORL_COMMON_DETAIL_OPERATORTHREAD_H
 
 #include <atomic>
+#include <condition_variable>
 #include <memory>
+#include <mutex>
 
 #include <vorl/Common/OpBase.h>
 #include <vorl/Platform/detail/Thread.h>
@@ -32,7 +34,11 @@ class OperatorThread {
 
   OpBase& m_owner;  ///< dangles once the thread has ended
   std::unique_ptr<Thread> m_thread;
-  std::atomic<bool> m_published{false};
+  // Not an atomic's own wait: where the standard library makes it of a mutex and a condition, a
+  // notice that comes between the look and the wait is lost.
+  std::mutex m_mutex;
+  std::condition_variable m_changed;
+  bool m_published = false;
   std::atomic<bool> m_released{false};
 };
 
