@@ -30,6 +30,7 @@ struct Bitmap {
   std::vector<Colour> palette;
   Bytes rows;  ///< as they are stored; empty: made up
   std::uint32_t infoSize = 40;
+  Bytes infoRest;  ///< of a longer header, behind its first 40 bytes
   int planes = 1;
   std::uint32_t compression = 0;
   std::uint32_t coloursUsed = 0;
@@ -84,6 +85,7 @@ inline Bytes InfoBytes(const Bitmap& bitmap) {
   Append(bytes, 0, 12);
   Append(bytes, bitmap.coloursUsed, 4);
   Append(bytes, 0, 4);
+  bytes.insert(bytes.end(), bitmap.infoRest.begin(), bitmap.infoRest.end());
   const Bytes palette = PaletteBytes(bitmap);
   bytes.insert(bytes.end(), palette.begin(), palette.end());
   bytes.insert(bytes.end(), bitmap.gap.begin(), bitmap.gap.end());

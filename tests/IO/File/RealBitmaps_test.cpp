@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -102,18 +103,27 @@ TEST(RealBitmaps, AreReadAsTheirTableSaysOrRefused) {
   EXPECT_EQ(matched, 13);
 }
 
+TEST(RealBitmaps, WithAColourProfileAreThoseWithout) {
+  dImage image, plain;
+  opDIB2Ima op;
+  ASSERT_TRUE(op.Convert((kFolder / "questionable/bs-rgb24prof.bmp").string().c_str(), image))
+      << op.GetStatus();
+  ASSERT_TRUE(op.Convert((kFolder / "good/bs-rgb24.bmp").string().c_str(), plain));
+  ASSERT_EQ(image.GetImageSize(), plain.GetImageSize());
+  EXPECT_EQ(std::memcmp(image.GetDataPtr(), plain.GetDataPtr(), plain.GetImageSize()), 0);
+}
+
 TEST(RealBitmaps, ThatAreNotPlainAreRefusedByName) {
   const struct {
     const char* file;
     const char* reason;
-  } kRefusals[] = {{"good/bs-pal8rle.bmp", "opDIB2Ima: unsupported compression: RLE8"},
-                   {"questionable/bs-pal4rletrns.bmp", "opDIB2Ima: unsupported compression: RLE4"},
-                   {"questionable/bs-pal8os2sp.bmp", "opDIB2Ima: unsupported header size: 12"},
-                   {"questionable/bs-rgb24png.bmp", "opDIB2Ima: unsupported header size: 124"},
-                   {"questionable/bs-rgb24prof.bmp", "opDIB2Ima: unsupported header size: 124"},
-                   {"questionable/bs-rgb32h52.bmp", "opDIB2Ima: unsupported header size: 52"},
-                   {"questionable/bs-rgba16-4444.bmp", "opDIB2Ima: unsupported header size: 124"},
-                   {"questionable/bs-rgba32-1.bmp", "opDIB2Ima: unsupported header size: 124"}};
+  } kRefusals[] = {
+      {"good/bs-pal8rle.bmp", "opDIB2Ima: unsupported compression: RLE8"},
+      {"questionable/bs-pal4rletrns.bmp", "opDIB2Ima: unsupported compression: RLE4"},
+      {"questionable/bs-pal8os2sp.bmp", "opDIB2Ima: unsupported header size: 12"},
+      {"questionable/bs-rgb24png.bmp", "opDIB2Ima: unsupported compression: PNG"},
+      {"questionable/bs-rgb32h52.bmp", "opDIB2Ima: unsupported compression: bit fields"},
+      {"questionable/bs-rgba16-4444.bmp", "opDIB2Ima: unsupported compression: bit fields"}};
   for (const auto& refusal : kRefusals) {
     dImage image;
     opDIB2Ima op;

@@ -185,11 +185,23 @@ TEST_F(opDIB2ImaRefusal, SizeMustBeOneOfAPicture) {
   }
 }
 
-TEST_F(opDIB2ImaRefusal, HeaderMustHaveFortyBytes) {
-  for (const std::uint32_t size : {0U, 12U, 39U, 41U, 52U, 56U, 64U, 108U, 124U, 0xFFFFFFFFU}) {
+TEST_F(opDIB2ImaRefusal, HeaderMustHaveAKnownSize) {
+  for (const std::uint32_t size : {0U, 12U, 39U, 41U, 53U, 64U, 107U, 125U, 0xFFFFFFFFU}) {
     Bitmap bitmap = Good();
     bitmap.infoSize = size;
     EXPECT_EQ(RefusalOf(bitmap), "opDIB2Ima: unsupported header size: " + std::to_string(size));
+  }
+}
+
+TEST_F(opDIB2ImaRefusal, MasksOfALongerHeaderMustBeThoseOfPlainPixels) {
+  for (const int bits : {16, 32}) {
+    Bitmap bitmap = Good();
+    bitmap.bits = bits;
+    bitmap.palette.clear();
+    bitmap.infoSize = 56;
+    bitmap.infoRest.assign(16, 0xF0);
+    bitmap.compression = 3;
+    EXPECT_EQ(RefusalOf(bitmap), "opDIB2Ima: unsupported compression: bit fields");
   }
 }
 

@@ -178,6 +178,32 @@ TEST_F(opDIB2ImaFile, ThirtyTwoBitMasksOfPlainPixelsAreRead) {
   EXPECT_EQ(ColourAt(image, 0, 0), (Colour{1, 2, 3}));
 }
 
+// Masks stand at the same place, whether as part of the header or behind it; the palette does not.
+TEST_F(opDIB2ImaFile, LongerHeadersAreRead) {
+  for (const std::uint32_t size : {52U, 56U, 108U, 124U}) {
+    Bitmap bitmap;
+    bitmap.width = 5;
+    bitmap.height = -2;
+    bitmap.infoSize = size;
+    bitmap.infoRest.assign(size - 40, 0xA5);
+    for (const int bits : {4, 8, 24}) {
+      bitmap.bits = bits;
+      bitmap.palette = Ramp(bits <= 8 ? 1 << bits : 0, false);
+      const dImage image = Read(bitmap);
+      for (int x = 0; x < 5; ++x) {
+        EXPECT_EQ(ColourAt(image, x, 1), ColourAt(bitmap, x, 1)) << size << ": " << x;
+      }
+    }
+    const Bytes masks = {0, 0, 0xFF, 0, 0, 0xFF, 0, 0, 0xFF, 0, 0, 0};
+    std::copy(masks.begin(), masks.end(), bitmap.infoRest.begin());
+    bitmap.bits = 32;
+    bitmap.palette.clear();
+    bitmap.compression = 3;
+    const dImage image = Read(bitmap);
+    EXPECT_EQ(ColourAt(image, 4, 0), ColourAt(bitmap, 4, 0));
+  }
+}
+
 TEST_F(opDIB2ImaFile, BothRowOrdersOfOnePictureGiveTheSameImage) {
   Bitmap up;
   up.width = 2;

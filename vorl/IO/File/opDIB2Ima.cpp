@@ -51,10 +51,6 @@ bool IsTargetDepth(int bits) {
   return bits == 1 || bits == 8 || bits == 24 || bits == 32;
 }
 
-bool AreMasksOfPlainPixels(const BitmapSource& source) {
-  return source.masks[0] == 0xFF0000 && source.masks[1] == 0xFF00 && source.masks[2] == 0xFF;
-}
-
 /// Empty when the pixels lie plain, else the name of their compression.
 std::string CompressionName(const BitmapSource& source) {
   switch (source.header.biCompression) {
@@ -65,10 +61,7 @@ std::string CompressionName(const BitmapSource& source) {
     case vorl_detail::kCompressionRle4:
       return "RLE4";
     case vorl_detail::kCompressionBitFields:
-      if (source.header.biBitCount == 16 || (source.HasMasks() && AreMasksOfPlainPixels(source))) {
-        return {};
-      }
-      return "bit fields";
+      return source.HasPlainMasks() ? std::string() : "bit fields";
     case vorl_detail::kCompressionJpeg:
       return "JPEG";
     case vorl_detail::kCompressionPng:
@@ -82,7 +75,7 @@ std::string CompressionName(const BitmapSource& source) {
 bool CheckHeader(const BitmapSource& source, dStatus& status) {
   const BITMAPINFOHEADER& header = source.header;
   const std::string compression = CompressionName(source);
-  if (header.biSize != sizeof(header)) {
+  if (!source.HasKnownHeader()) {
     status.Set(false, "opDIB2Ima: unsupported header size: %lu",
                static_cast<unsigned long>(header.biSize));
   } else if (header.biPlanes != 1) {

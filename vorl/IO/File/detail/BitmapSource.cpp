@@ -17,6 +17,10 @@ static_assert(std::endian::native == std::endian::little, "bitmap headers are re
 
 constexpr WORD kBitmapFileType = 19778;  // the characters "BM"
 constexpr DWORD kInfoHeaderSize = sizeof(tagBITMAPINFOHEADER);
+// The header with red, green and blue masks, with alpha, with colour space, and with profile: each
+// begins with the fields of the one before.
+constexpr DWORD kLongerHeaders[] = {52, 56, 108, 124};
+constexpr DWORD kLargestHeader = 124;
 constexpr DWORD kHeaderSizes = sizeof(tagBITMAPFILEHEADER) + kInfoHeaderSize;
 
 std::uint64_t Magnitude(LONG value) {
@@ -46,25 +50,48 @@ std::uint64_t BitmapSource::TotalBytes() const {
   return header.biBitCount <= 32 ? RowBytes() * Height() : 0;  // up to 32 bits it fits
 }
 
-bool BitmapSource::HasMasks() const {
-  return header.biBitCount == 32 && header.biCompression == kCompressionBitFields;
+bool BitmapSource::HasKnownHeader() const {
+  return header.biSize == kInfoHeaderSize ||
+         std::find(std::begin(kLongerHeaders), std::end(kLongerHeaders), header.biSize) !=
+             std::end(kLongerHeaders);
 }
 
-void BitmapSource::SetPalette(const void* table, std::size_t bytes) {
+bool BitmapSource::HasPlainMasks() const {
+  using Masks = std::array<DWORD, 3>;
+  if (header.biBitCount == 16) {
+    // Behind the short header they are not looked at: such a bitmap is always read as 5-5-5.
+    return header.biSize == kInfoHeaderSize || masks == Masks{0x7C00, 0x3E0, 0x1F};
+  }
+  return header.biBitCount == 32 && masks == Masks{0xFF0000, 0xFF00, 0xFF};
+}
+
+std::size_t BitmapSource::BytesBeforePalette() const {
+  const bool masksFollow =
+      header.biSize == kInfoHeaderSize && header.biCompression == kCompressionBitFields;
+  return header.biSize - kInfoHeaderSize + (masksFollow ? sizeof(masks) : 0);
+}
+
+std::size_t BitmapSource::StatedColours() const {
   const std::size_t nameable = NameableColours(header.biBitCount);
-  const std::size_t stated = header.biClrUsed != 0 ? header.biClrUsed : nameable;
-  const std::size_t entries = std::min({nameable, stated, bytes / sizeof(tagRGBQUAD)});
-  std::memcpy(palette.data(), table, entries * sizeof(tagRGBQUAD));
+  return header.biClrUsed != 0 ? std::min<std::size_t>(header.biClrUsed, nameable) : nameable;
+}
+
+void BitmapSource::SetTables(const unsigned char* tables, std::size_t bytes) {
+  std::memcpy(masks.data(), tables, std::min(bytes, sizeof(masks)));
+  const std::size_t skipped = std::min(bytes, BytesBeforePalette());
+  const std::size_t entries = std::min(StatedColours(), (bytes - skipped) / sizeof(tagRGBQUAD));
+  std::memcpy(palette.data(), tables + skipped, entries * sizeof(tagRGBQUAD));
   paletteEntries = static_cast<unsigned int>(entries);
 }
 
 BitmapInMemory::BitmapInMemory(const tagBITMAPINFO* info, const void* bits)
     : m_bits(static_cast<const unsigned char*>(bits)) {
-  std::memcpy(&header, info, sizeof(header));
-  if (header.biSize == kInfoHeaderSize) {
-    const auto* table = reinterpret_cast<const unsigned char*>(info) + kInfoHeaderSize;
-    SetPalette(table, sizeof(palette));
-    std::memcpy(masks.data(), table, HasMasks() ? sizeof(masks) : 0);
+  std::memcpy(&header, info, sizeof(header.biSize));
+  if (HasKnownHeader()) {
+    std::memcpy(&header, info, sizeof(header));
+    // What the header speaks of, and no more: the block may end there.
+    SetTables(reinterpret_cast<const unsigned char*>(info) + kInfoHeaderSize,
+              BytesBeforePalette() + StatedColours() * sizeof(tagRGBQUAD));
   }
   pixelBytes = std::numeric_limits<std::uint64_t>::max();
 }
@@ -101,27 +128,26 @@ bool BitmapInFile::ReadHeaders(dStatus& status) {
     status.Set(false, "file '%s' ends within its header", m_path);
     return false;
   }
-  if (header.biSize != kInfoHeaderSize) {
+  if (!HasKnownHeader()) {
     return true;  // refused by the operator, like such a header in memory
   }
   if (!Read(bytes + sizeof(header.biSize), kInfoHeaderSize - sizeof(header.biSize))) {
     status.Set(false, "file '%s' ends within its header", m_path);
     return false;
   }
-  if (fileHeader.bfOffBits < kHeaderSizes || fileHeader.bfSize < fileHeader.bfOffBits ||
-      fileHeader.bfSize > FileSize(m_file.get())) {
+  if (fileHeader.bfOffBits < sizeof(fileHeader) + header.biSize ||
+      fileHeader.bfSize < fileHeader.bfOffBits || fileHeader.bfSize > FileSize(m_file.get())) {
     status.Set(false, "file '%s' has sizes that cannot be true", m_path);
     return false;
   }
-  std::array<unsigned char, sizeof(palette)> table{};
+  std::array<unsigned char, kLargestHeader + sizeof(masks) + sizeof(palette)> tables{};
   const std::size_t tableBytes =
-      std::min<std::size_t>(fileHeader.bfOffBits - kHeaderSizes, table.size());
-  if (!Read(table.data(), tableBytes) || !SeekFile(m_file.get(), fileHeader.bfOffBits)) {
+      std::min<std::size_t>(fileHeader.bfOffBits - kHeaderSizes, tables.size());
+  if (!Read(tables.data(), tableBytes) || !SeekFile(m_file.get(), fileHeader.bfOffBits)) {
     SetCutOff(status);
     return false;
   }
-  SetPalette(table.data(), tableBytes);
-  std::memcpy(masks.data(), table.data(), sizeof(masks));
+  SetTables(tables.data(), tableBytes);
   pixelBytes = fileHeader.bfSize - fileHeader.bfOffBits;
   return true;
 }

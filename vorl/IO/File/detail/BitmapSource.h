@@ -43,19 +43,25 @@ class BitmapSource {
   std::uint64_t Width() const;
   std::uint64_t Height() const;
   bool IsBottomUp() const { return header.biHeight >= 0; }
-  /// True when masks that matter stand behind the header.
-  bool HasMasks() const;
+  /// True for the header of 40 bytes and for those that go on behind its fields.
+  bool HasKnownHeader() const;
+  /// True when bit fields, if there are any, lie where they would without being told.
+  bool HasPlainMasks() const;
 
   BITMAPINFOHEADER header{};
   std::array<tagRGBQUAD, 256> palette{};  ///< black behind the entries that there are
   unsigned int paletteEntries = 0;        ///< no more than the bits per pixel can name
-  std::array<DWORD, 3> masks{};           ///< of red, green and blue
+  std::array<DWORD, 3> masks{};           ///< of red, green and blue; 0: none
   std::uint64_t pixelBytes = 0;           ///< the bytes of pixels that there are
 
  protected:
   BitmapSource() = default;
-  /// Takes the palette from what follows the header.
-  void SetPalette(const void* table, std::size_t bytes);
+  /// Takes masks and palette from what follows the first 40 bytes of the header.
+  void SetTables(const unsigned char* tables, std::size_t bytes);
+  /// From the end of the header's first 40 bytes on.
+  std::size_t BytesBeforePalette() const;
+  /// The entries of the palette that the header speaks of.
+  std::size_t StatedColours() const;
 };
 
 /// A bitmap in memory. Header and colour table are copied.
