@@ -28,7 +28,7 @@ void WritePng(const fs::path& path, int width, int height, png_uint_32 format, c
   png.height = static_cast<png_uint_32>(height);
   png.format = format;
   png.colormap_entries = static_cast<png_uint_32>(colours.size() / 3);
-  ASSERT_NE(png_image_write_to_file(&png, path.c_str(), 0, pixels.data(), 0,
+  ASSERT_NE(png_image_write_to_file(&png, path.string().c_str(), 0, pixels.data(), 0,
                                     colours.empty() ? nullptr : colours.data()),
             0)
       << png.message;
