@@ -28,7 +28,7 @@ std::string NumberedName(const std::string& path, int number, int count) {
   text.insert(0, digits - std::min(digits, text.size()), '0');
   const fs::path name =
       fs::path(path).stem().string() + "-" + text + fs::path(path).extension().string();
-  return (fs::path(path).parent_path() / name).string();
+  return fs::path(path).replace_filename(name).string();
 }
 
 class MipCommand : public Command {

@@ -1,6 +1,7 @@
 # Runs one GROUP of the scenes with PROGRAM and compares what it prints with the file EXPECTED.
 cmake_minimum_required(VERSION 3.20)
 execute_process(COMMAND ${PROGRAM} --group ${GROUP} OUTPUT_VARIABLE printed RESULT_VARIABLE result)
+string(REPLACE "\r" "" printed "${printed}")
 if(NOT result EQUAL 0)
   message(FATAL_ERROR "the scenes of ${GROUP} ended with ${result}, having printed:\n${printed}")
 endif()

@@ -71,8 +71,8 @@ void Raster::Set(int x, int y, std::uint32_t value) {
   if (bits < 8) {
     const int shift = 8 - bits - x * bits % 8;
     const std::uint32_t mask = ((1U << bits) - 1U) << shift;
-    std::uint8_t& byte = row[x * bits / 8];
-    byte = static_cast<std::uint8_t>((byte & ~mask) | ((value << shift) & mask));
+    std::uint8_t& raw = row[x * bits / 8];
+    raw = static_cast<std::uint8_t>((raw & ~mask) | ((value << shift) & mask));
     return;
   }
   for (int k = 0; k < bits / 8; ++k) {

@@ -177,11 +177,13 @@ TEST(BmpConvert, FailureKeepsTheOldOutputAndLeavesNothing) {
   EXPECT_EQ(outcome.errors,
             "vorl: can't read '" + bad + "': file '" + bad + "' has sizes that cannot be true\n");
   EXPECT_EQ(ReadBytes(output), "old");
+#if !defined(_WIN32)  // nothing limits the size of files there
   for (const char* const name : {"full.bmp", "full.bdf", "full.png"}) {
     cli_test::Conditions full;
     full.largestFile = 20;
     EXPECT_EQ(RunTool({"bmp", "convert", good, (folder / name).string()}, full).code, 1) << name;
   }
+#endif
   EXPECT_EQ(folder.Names(), (Names{"bad.bmp", "good.bmp", "out.png"}));
 }
 

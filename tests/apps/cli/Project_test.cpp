@@ -209,6 +209,7 @@ TEST_F(Project, SlicesGoThroughTheCentre) {
   EXPECT_EQ(picture.At(9, 9), Level(At(9, 9, 17)));
 }
 
+#if !defined(_WIN32)  // no signals and no pseudo terminal there
 TEST_F(Project, InterruptedItLeavesTheEarlierFile) {
   study_test::WriteBytes(PathOf("a.png"), "earlier");
   Conditions conditions;
@@ -224,6 +225,8 @@ TEST_F(Project, InterruptedItLeavesTheEarlierFile) {
   EXPECT_EQ(m_folder.Names(), (Names{"a.png", "volume.bdf"}));
   EXPECT_EQ(study_test::ReadBytes(PathOf("a.png")), "earlier");
 }
+
+#endif
 
 TEST_F(Project, AVolumeFarBeyondThePictureIsRefused) {
   const Outcome outcome = RunTool(

@@ -264,6 +264,7 @@ TEST_F(Select, APercentageOfLessThanAVoxelIsRefused) {
   EXPECT_EQ(m_folder.Names(), Names{"volume.bdf"});
 }
 
+#if !defined(_WIN32)  // no signals, no pseudo terminal, and nothing limits the size of files
 TEST_F(Select, InterruptedItLeavesNothing) {
   Conditions conditions;
   conditions.terminalColumns = 80;
@@ -288,6 +289,8 @@ TEST_F(Select, FullDisksAreFailuresThatLeaveNothing) {
                                 "': the disk is full, or the writing failed\n");
   EXPECT_EQ(m_folder.Names(), Names{"volume.bdf"});
 }
+
+#endif
 
 struct SelectUsage {
   Arguments arguments;
