@@ -152,7 +152,8 @@ struct Stretch {
 // Which source column a target column shows, by searching: -1 for none.
 int SourceColumn(const Stretch& s, int target, int sourceSize) {
   const int count = std::abs(s.width);
-  const int sourceCount = std::abs(s.sourceWidth);
+  // Stretched to one column, a picture goes without its last one.
+  const int sourceCount = std::abs(s.sourceWidth) - (s.width == 1 && s.sourceWidth > 1 ? 1 : 0);
   const int t = s.width < 0 ? s.x - target : target - s.x;
   if (t < 0 || t >= count) {
     return -1;
