@@ -59,6 +59,10 @@ class opVoxelClassification;
 class AnchoredTrafo2D;
 class Geom2D;
 class Geom3D;
+class GraphicHandler;
+class GraphicViewPort;
+class IGraphicViewPort;
+class InputEventHandler;
 class MultiTrafo2D;
 class Rect2D;
 class Rotate2D;
@@ -69,6 +73,7 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGObjectView;
 class vIma2Device;
 
 }  // namespace vorl

@@ -31,6 +31,8 @@
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/GUI/Geom2D.h>
+#include <vorl/GUI/GraphicViewPort.h>
+#include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
