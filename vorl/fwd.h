@@ -61,7 +61,9 @@ class Geom2D;
 class Geom3D;
 class GraphicHandler;
 class GraphicViewPort;
+class IGraphicHandler;
 class IGraphicViewPort;
+class IVGObjectView;
 class InputEventHandler;
 class MultiTrafo2D;
 class Rect2D;
@@ -73,6 +75,7 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGObject;
 class VGObjectView;
 class vIma2Device;
 
