@@ -179,6 +179,7 @@ class RecordingViewClient : public IVGObjectView {
 class CreatingHandler : public GraphicHandler {
  public:
   explicit CreatingHandler(Lines& lines) : m_lines(lines) {}
+  CreatingHandler(const CreatingHandler& source) = default;
   VGObjectView* CreateObject(VGType type) override {
     m_lines.push_back("CreateObject " + std::to_string(type));
     if (createsNothing) {
