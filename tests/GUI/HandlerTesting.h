@@ -30,7 +30,7 @@ class RecordingView : public VGObjectView {
   RecordingView(Lines& lines, const char* name, float x = 0, float y = 0)
       : m_lines(lines), m_name(name), m_x(x), m_y(y) {
     SetViewState(VGViewState_Visible);
-    VGObjectView::Enable(VGEnableFlag_Select);
+    VGObjectView::Enable(VGOperation_Select);
   }
   RecordingView(const RecordingView& source) = default;
   RecordingView& operator=(const RecordingView&) = delete;
@@ -190,7 +190,7 @@ class CreatingHandler : public GraphicHandler {
     object->type = type;
     object->SetUserData(99);
     object->ResetViewState(VGViewState_Visible);
-    object->Disable(VGEnableFlag_All);
+    object->Disable(VGOperation_All);
     object->SetDynamicCreationFlag();
     if (onCreate) {
       onCreate(*object);

@@ -89,7 +89,7 @@ bool GraphicHandler::CreateByClick(int flags, dVect2D& point) {
     object->SetObjID(m_createID);
     m_createID = -1;
   }
-  object->Enable(VGEnableFlag_All);
+  object->Enable(VGOperation_All);
   object->ProcessMouseEvent(MouseEvent_ButtonDown, flags, point);
   if (m_pActive == object) {
     object->Select(true);

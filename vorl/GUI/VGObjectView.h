@@ -33,16 +33,12 @@ enum VGType : int {
 enum VGOperation : short {
   VGOperation_None = 0,
   VGOperation_Create = 1,
+  VGOperation_Select = 2,  ///< the mouse can grab the object at all; no operation by itself
   VGOperation_Modify = 4,
   VGOperation_Move = 8,
   VGOperation_Resize = 16,
-  VGOperation_Rotate = 32
-};
-
-/// Further enable bits of a view.
-enum VGEnableFlag : short {
-  VGEnableFlag_Select = 2,  ///< the mouse can grab the object at all
-  VGEnableFlag_All = 0x3F   ///< and every operation is allowed
+  VGOperation_Rotate = 32,
+  VGOperation_All = 0x3F
 };
 
 /// The bits of the view state.
@@ -170,7 +166,7 @@ class VORL_API VGObjectView {
   bool IsSelected() const;
   bool IsVisible() const;
 
-  /// Allow and forbid operations (bits of `VGOperation` and `VGEnableFlag`).
+  /// Allow and forbid operations (bits of `VGOperation`).
   void Enable(short bits);
   void Disable(short bits);
   /// All of these bits are set.
