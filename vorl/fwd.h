@@ -75,8 +75,12 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGLine;
+class VGLineView;
 class VGObject;
 class VGObjectView;
+class VGRect;
+class VGRectView;
 class vIma2Device;
 
 }  // namespace vorl
