@@ -253,13 +253,6 @@ void GraphicViewPort::GetDrawWin(Rect2D& draw) const {
   draw.Set(whole);
 }
 
-void GraphicViewPort::GetDeviceWin(tagRECT& view) const {
-  const dVect2D topLeft = m_viewWin.GetTL();
-  const dVect2D bottomRight = m_viewWin.GetBR();
-  view = {WholePixel(topLeft.x, 0.0), WholePixel(topLeft.y, 0.0), WholePixel(bottomRight.x, 0.0),
-          WholePixel(bottomRight.y, 0.0)};
-}
-
 void GraphicViewPort::SetBorder(int left, int top, int right, int bottom) {
   m_leftBorder = ToBorder(left);
   m_topBorder = ToBorder(top);

@@ -380,7 +380,8 @@ class VORL_API GraphicViewPort {
   void OnViewWinChanged();
   Rect2D ScrollRange() const;
   Rect2D WithoutBorders(const Rect2D& view) const;
-  void GetDeviceWin(tagRECT& view) const;
+  /// The view and the draw window as they are drawn, rounded alike.
+  void GetDeviceWins(tagRECT& view, tagRECT& draw) const;
   void SetFlag(short flag, bool on);
   bool Pan(const tagPOINT& point);
   bool Move(const tagPOINT& point);

@@ -31,6 +31,16 @@ void Fill(HDC dc, const tagRECT& rect, std::uint32_t color) {
   }
 }
 
+/// What borders leave of a window: nothing when they overlap. A mirrored window stays mirrored.
+void EmptyWhereBordersOverlap(const tagRECT& view, tagRECT& draw) {
+  if (view.left <= view.right && draw.right < draw.left) {
+    draw.right = draw.left;
+  }
+  if (view.top <= view.bottom && draw.bottom < draw.top) {
+    draw.bottom = draw.top;
+  }
+}
+
 LONG WholePixel(float edge) {
   return Truncated<LONG>(edge + 0.5);
 }
@@ -105,14 +115,20 @@ long GraphicViewPort::GetBorderColor() const {
   return static_cast<long>(m_borderColor);
 }
 
+void GraphicViewPort::GetDeviceWins(tagRECT& view, tagRECT& draw) const {
+  const dVect2D topLeft = m_viewWin.GetTL();
+  const dVect2D bottomRight = m_viewWin.GetBR();
+  view = {WholePixel(topLeft.x), WholePixel(topLeft.y), WholePixel(bottomRight.x),
+          WholePixel(bottomRight.y)};
+  GetDrawWin(draw);
+  EmptyWhereBordersOverlap(view, draw);
+}
+
 void GraphicViewPort::ClipToWindow(HDC dc) const {
-  tagRECT window;
-  if (IsEnabled(ViewPortFlag_ClipBorders)) {
-    GetDrawWin(window);
-  } else {
-    GetDeviceWin(window);
-  }
-  IntersectClip(dc, window);
+  tagRECT view;
+  tagRECT draw;
+  GetDeviceWins(view, draw);
+  IntersectClip(dc, IsEnabled(ViewPortFlag_ClipBorders) ? draw : view);
 }
 
 void GraphicViewPort::ClipTo(HDC dc, Rect2D* clip, bool clipIsGraphic) const {
@@ -169,8 +185,7 @@ void GraphicViewPort::EraseBkgnd(HDC dc, Rect2D* clip, bool clipIsGraphic) {
   }
   tagRECT view;
   tagRECT draw;
-  GetDeviceWin(view);
-  GetDrawWin(draw);
+  GetDeviceWins(view, draw);
   IntersectClip(dc, view);
   ClipTo(dc, clip, clipIsGraphic);
   Fill(dc, draw, m_bgColor);
