@@ -84,7 +84,7 @@ class VORL_API IGraphicViewPort {
 /// computes the transformation. Where a function calls it itself, that is said.
 ///
 /// *Ownership.* Handlers and the interface belong to the caller, who removes them here before they
-/// go. A copied viewport shares them.
+/// go. A copied viewport shares them; without memory the copy shows no handlers.
 ///
 /// *Errors.* Nothing fails. Degenerate rectangles are absorbed where that is said, and give
 /// infinities or NaN elsewhere; numbers that do not fit the device's integers become the nearest
@@ -204,7 +204,8 @@ class VORL_API GraphicViewPort {
   unsigned short GetBottomBorder() const;
   unsigned short GetLeftBorder() const;
   unsigned short GetRightBorder() const;
-  /// What `EraseBkgnd` fills the draw window and the border with (0x00bbggrr).
+  /// What `EraseBkgnd` fills the draw window and the border with (0x00bbggrr, in the lower 32
+  /// bits).
   void SetBgColor(long color);
   void SetBorderColor(long color);
   long GetBgColor() const;
@@ -308,10 +309,12 @@ class VORL_API GraphicViewPort {
   void UpdateTransformation(Rect2D& window, const Rect2D& view);
 
   /// Shows one handler (null for none) in place of those so far, which keep their transformation. A
-  /// captured one still receives the mouse until the button is up.
+  /// captured one still receives the mouse until the button is up: one that is to go before that is
+  /// removed with `RemoveGraphic`.
   void SetGraphic(GraphicHandler* graphic);
-  /// Shows a handler on top of the others; one that is shown already is moved to the top.
-  void AddGraphic(GraphicHandler* graphic);
+  /// Shows a handler on top of the others; one that is shown already is moved to the top. False for
+  /// null and without memory.
+  bool AddGraphic(GraphicHandler* graphic);
   /// Removes a handler, or with null all of them; they lose their transformation and the capture.
   /// With no handlers at all, the transformation of the given one stays.
   void RemoveGraphic(GraphicHandler* graphic);
@@ -366,16 +369,25 @@ class VORL_API GraphicViewPort {
   bool StopInteractiveOp(const tagPOINT& point);
 
  private:
+  /// The handlers in the order of drawing. A copy for which there is no memory is empty.
+  class HandlerList : public std::vector<GraphicHandler*> {
+   public:
+    HandlerList();
+    HandlerList(const HandlerList& source);
+    HandlerList& operator=(const HandlerList& source);
+  };
+
   void OnViewWinChanged();
   Rect2D ScrollRange() const;
   Rect2D WithoutBorders(const Rect2D& view) const;
-  void GetDeviceWin(tagRECT& view) const;
-  void SetModes(unsigned char mode, bool width, bool height);
-  void SetFlag(unsigned flag, bool on);
+  /// The view and the draw window as they are drawn, rounded alike.
+  void GetDeviceWins(tagRECT& view, tagRECT& draw) const;
+  void SetFlag(short flag, bool on);
   bool Pan(const tagPOINT& point);
   bool Move(const tagPOINT& point);
   bool Zoom(const tagPOINT& point);
-  bool OfferButtonDown(int event, int flags, tagPOINT& point);
+  bool OfferButtonDown(int event, int flags, const tagPOINT& point);
+  bool PassToCaptured(int event, int flags, tagPOINT& point);
   void ClipToWindow(HDC dc) const;
   void ClipTo(HDC dc, Rect2D* clip, bool clipIsGraphic) const;
 
@@ -404,7 +416,7 @@ class VORL_API GraphicViewPort {
   tagPOINT m_moveOffset{};  ///< from the view window's corner to where a move began
   dVect2D m_viewRefPos;
   dVect2D m_graphicRefPos;
-  std::vector<GraphicHandler*> m_handlers;
+  HandlerList m_handlers;
   GraphicHandler* m_captured = nullptr;
   IGraphicViewPort* m_interface = nullptr;
 };
