@@ -105,10 +105,11 @@ class RandomUser {
     flags |= Chance(3) ? MK_SHIFT : 0;
     flags |= Chance(3) ? MK_CONTROL : 0;
     const Rect2D view = m_viewPort.GetViewWin();
-    const auto near = [&](float edge, double size) {
+    const auto around = [&](float edge, double size) {
       return static_cast<LONG>(edge) + Number(-20, static_cast<int>(size) + 20);
     };
-    const tagPOINT point{near(view.GetTL().x, view.Width()), near(view.GetTL().y, view.Height())};
+    const tagPOINT point{around(view.GetTL().x, view.Width()),
+                         around(view.GetTL().y, view.Height())};
     m_what << event << "/" << flags << " at " << point.x << " " << point.y;
     const std::string expected = Foretell(event, flags, point);
     const Rect2D window = m_viewPort.GetGraphicWin();

@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <limits>
 #include <string>
 
 #include "ViewPortTesting.h"
@@ -229,6 +230,16 @@ TEST(GraphicViewPortTrafo, FreeAreaIsUnitedWithTheStoredWindow) {
   ExpectEdges(window, -50, 30, 0, 100);
 }
 
+TEST(GraphicViewPortTrafo, FreeAreaLetsTheWindowGoAnywhere) {
+  OpenViewPort viewPort(kSquare, Rect2D(500, -700, 600, -600), kSquare);
+  viewPort.SetFixedGraphicArea(false);
+  viewPort.UpdateTransformation();
+  ExpectEdges(viewPort.GetGraphicWin(), 500, -700, 600, -600);
+  viewPort.SetFixedGraphicArea(true);
+  viewPort.UpdateTransformation();
+  ExpectEdges(viewPort.GetGraphicWin(), 0, 0, 100, 100);
+}
+
 TEST(GraphicViewPortTrafo, AlignmentPlacesAWindowThatIsLargerThanTheRange) {
   struct Case {
     unsigned char alignment;
@@ -256,7 +267,7 @@ TEST(GraphicViewPortTrafo, AlignmentPlacesAWindowThatIsLargerThanTheRange) {
 TEST(GraphicViewPortTrafo, AlignmentGoesByTheGraphicWindowsOwnSize) {
   // The same size as the range is not larger.
   OpenViewPort same(kSquare, kSquare);
-  same.SetAlignment(15);
+  same.SetAlignment(5);
   Rect2D window(-50, -50, 150, 150);
   EXPECT_FALSE(same.CorrectPosition(window)) << "the stored window is no larger than the range";
   OpenViewPort larger(kSquare, Rect2D(0, 0, 101, 101));
@@ -267,6 +278,30 @@ TEST(GraphicViewPortTrafo, AlignmentGoesByTheGraphicWindowsOwnSize) {
   window.Set(30, 40, 50, 60);
   EXPECT_TRUE(larger.CorrectPosition(window)) << "aligned although it lies inside";
   ExpectEdges(window, 0, 0, 20, 20);
+}
+
+TEST(GraphicViewPortTrafo, AlignmentSeesTheSizeThatTheLimitsLeave) {
+  // 50 units at scale 2; the maximum shows twice the area.
+  OpenViewPort viewPort(kSquare, Rect2D(20, 20, 70, 70), kSquare);
+  viewPort.SetScaleFactors(1, 1, 0.1F, 0.5F, 0.1F, 0.5F);
+  viewPort.SetAlignment(5);
+  viewPort.UpdateTransformation();
+  ExpectEdges(viewPort.GetGraphicWin(), 0, 0, 200, 200);
+}
+
+TEST(GraphicViewPortTrafo, ScalesThatCannotBeReachedKeepTheSize) {
+  OpenViewPort viewPort(kSquare);
+  viewPort.SetScaleFactors(1, 1, 0, 10, 0, 10);
+  viewPort.MinSize();
+  viewPort.UpdateTransformation();
+  ExpectEdges(viewPort.GetGraphicWin(), 0, 0, 100, 100);
+  for (const float original : {0.0F, std::numeric_limits<float>::infinity(), std::nanf("")}) {
+    viewPort.SetScaleFactors(original, original, 0.1F, 10, 0.1F, 10);
+    viewPort.SetViewMode(0, 0);
+    viewPort.UpdateTransformation();
+    ExpectEdges(viewPort.GetGraphicWin(), 0, 0, 100, 100);
+    EXPECT_EQ(viewPort.GetTrafo().GetSx(), 1.0);
+  }
 }
 
 TEST(GraphicViewPortTrafo, ViewWithoutAreaChangesNothing) {
@@ -281,7 +316,12 @@ TEST(GraphicViewPortTrafo, ViewWithoutAreaChangesNothing) {
     ExpectEdges(viewPort.GetViewWin(), 0, 0, 100, 100);
     EXPECT_EQ(viewPort.GetTrafo().GetSx(), 1.0);
   }
-  // Nor does one that is all border.
+  // Nor does one without area that borders turn inside out, or one that is all border.
+  viewPort.SetBorder(5);
+  Rect2D window(1, 2, 3, 4);
+  viewPort.UpdateTransformation(window, Rect2D(5, 0, 5, 100));
+  viewPort.UpdateTransformation(window, Rect2D(0, 5, 100, 5));
+  ExpectEdges(window, 1, 2, 3, 4);
   viewPort.SetBorder(50);
   viewPort.UpdateTransformation();
   EXPECT_EQ(viewPort.GetTrafo().GetSx(), 1.0);
