@@ -59,6 +59,12 @@ class opVoxelClassification;
 class AnchoredTrafo2D;
 class Geom2D;
 class Geom3D;
+class GraphicHandler;
+class GraphicViewPort;
+class IGraphicHandler;
+class IGraphicViewPort;
+class IVGObjectView;
+class InputEventHandler;
 class MultiTrafo2D;
 class Rect2D;
 class Rotate2D;
@@ -69,6 +75,12 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGLine;
+class VGLineView;
+class VGObject;
+class VGObjectView;
+class VGRect;
+class VGRectView;
 class vIma2Device;
 
 }  // namespace vorl

@@ -31,9 +31,15 @@
 #include <vorl/Data/dVolume.h>
 #include <vorl/Data/dWindowingLUT.h>
 #include <vorl/GUI/Geom2D.h>
+#include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/GraphicViewPort.h>
+#include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/VGLine.h>
+#include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/VGRect.h>
 #include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/IO/File/opDIB2Ima.h>

@@ -194,6 +194,13 @@ inline constexpr DWORD ERROR_NOT_ENOUGH_MEMORY = 8;
 inline constexpr DWORD ERROR_INVALID_PARAMETER = 87;
 inline constexpr DWORD ERROR_BUSY = 170;  ///< the object is selected into a device context
 
+// Keys and buttons that are down during a mouse event
+inline constexpr int MK_LBUTTON = 1;
+inline constexpr int MK_RBUTTON = 2;
+inline constexpr int MK_SHIFT = 4;
+inline constexpr int MK_CONTROL = 8;
+inline constexpr int MK_MBUTTON = 16;
+
 #endif
 
 #endif

@@ -1,0 +1,193 @@
+// What the handler calls may delete anything in its list. These tests mean most under a memory
+// checker.
+
+#include <vorl/GUI/GraphicHandler.h>
+
+#include <gtest/gtest.h>
+
+#include "HandlerTesting.h"
+
+namespace {
+
+using gui_testing::Layer;
+using gui_testing::Lines;
+using gui_testing::RecordingView;
+
+/// Three owned objects side by side, the first of which tells the interface.
+class GraphicHandlerCallbacks : public ::testing::Test {
+ protected:
+  GraphicHandlerCallbacks()
+      : first(layer.AddOwned(1, 0, 0)),
+        second(layer.AddOwned(2, 5, 0)),
+        third(layer.AddOwned(3, 20, 0)) {
+    first.SetInterface(&layer.viewClient);
+    layer.client.actions["OnDeleteObject"] = [](GraphicHandler* handler, VGObjectView* object) {
+      handler->DeleteObject(object);  // once more does no harm
+      EXPECT_FALSE(handler->AddObject(object)) << "it is beyond saving";
+    };
+  }
+  Layer layer;
+  RecordingView& first;
+  RecordingView& second;
+  RecordingView& third;
+};
+
+TEST_F(GraphicHandlerCallbacks, BeginOfAnOperationMayDeleteTheObject) {
+  layer.viewClient.actions["OnBeginGraphicOp"] = [&](VGObjectView* object) {
+    layer.handler.DeleteObject(object);
+  };
+  EXPECT_TRUE(layer.Down(2, 2));
+  EXPECT_EQ(layer.Take(), (Lines{"1: move (2, 2)", "OnBeginGraphicOp 1 8", "OnDeleteObject 1",
+                                 "1: end", "OnSelectObject null"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, MoveMayDeleteTheObject) {
+  layer.viewClient.actions["OnGraphicChanged"] = [&](VGObjectView* object) {
+    layer.handler.DeleteObject(object);
+  };
+  layer.Down(2, 2);
+  layer.Take();
+  EXPECT_TRUE(layer.Move(3, 3));
+  EXPECT_EQ(layer.Take(),
+            (Lines{"1: moving (3, 3)", "OnGraphicChanged 1 8", "OnDeleteObject 1", "1: end"}))
+      << "nothing is modified any more";
+}
+
+TEST_F(GraphicHandlerCallbacks, EndOfAnOperationMayDestroyTheObjectItself) {
+  layer.viewClient.actions["OnEndGraphicOp"] = [](VGObjectView* object) { delete object; };
+  layer.Down(2, 2);
+  layer.Take();
+  EXPECT_TRUE(layer.Up(3, 3));
+  EXPECT_EQ(layer.Take(), (Lines{"1: moved (3, 3)", "OnEndGraphicOp 1 8", "1: end"}));
+  EXPECT_EQ(layer.handler.GetActiveObject(), nullptr);
+  EXPECT_EQ(layer.handler.GetObject(1), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, ModificationMayDeleteAll) {
+  for (const char* call : {"OnModifyObject", "OnObjectModified", "OnSelectObject"}) {
+    layer.client.actions[call] = [](GraphicHandler* handler, VGObjectView*) {
+      handler->DeleteAll();
+    };
+  }
+  EXPECT_TRUE(layer.Down(2, 2)) << "the object was there";
+  EXPECT_EQ(layer.handler.GetActiveObject(), nullptr);
+  EXPECT_EQ(layer.handler.GetObject(3), nullptr);
+  layer.AddOwned(4, 0, 0);
+  layer.client.actions.erase("OnSelectObject");
+  layer.Down(2, 2);
+  EXPECT_TRUE(layer.Move(3, 3));
+  EXPECT_EQ(layer.handler.GetObject(4), nullptr);
+  layer.client.actions.erase("OnModifyObject");
+  layer.AddOwned(5, 0, 0);
+  layer.Down(2, 2);
+  EXPECT_TRUE(layer.Up(3, 3));
+  EXPECT_EQ(layer.handler.GetObject(5), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, RightClickMayDeleteAll) {
+  layer.client.actions["OnSelectObject"] = [](GraphicHandler* handler, VGObjectView*) {
+    handler->DeleteAll();
+  };
+  EXPECT_FALSE(layer.Mouse(MouseEvent_ButtonDown, MK_RBUTTON, 2, 2));
+  EXPECT_EQ(layer.handler.GetActiveObject(), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, DeletionMayDeleteTheOthers) {
+  layer.client.actions["OnDeleteObject"] = [](GraphicHandler* handler, VGObjectView*) {
+    handler->DeleteAll();
+  };
+  EXPECT_TRUE(layer.handler.DeleteObjects(VGType_Rect, -1));
+  EXPECT_EQ(layer.Take(), (Lines{"OnDeleteObject 1", "OnDeleteObject 2", "OnDeleteObject 3",
+                                 "3: end", "2: end", "1: end"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, DeletionMayDestroyTheObjectItself) {
+  layer.client.actions["OnDeleteObject"] = [](GraphicHandler*, VGObjectView* object) {
+    delete object;
+  };
+  EXPECT_TRUE(layer.handler.DeleteAll());
+  EXPECT_EQ(layer.Take(), (Lines{"OnDeleteObject 1", "1: end", "OnDeleteObject 2", "2: end",
+                                 "OnDeleteObject 3", "3: end"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, DeletionEndsThoughEachOneAddsAnother) {
+  layer.client.actions["OnDeleteObject"] = [&](GraphicHandler* handler, VGObjectView*) {
+    auto* next = new RecordingView(layer.lines, "next");
+    next->SetDynamicCreationFlag();
+    next->SetUserData(9);
+    handler->AddObject(next);
+  };
+  EXPECT_TRUE(layer.handler.DeleteAll());
+  EXPECT_EQ(layer.handler.GetObject(1), nullptr);
+  EXPECT_EQ(layer.handler.GetObject(3), nullptr);
+  EXPECT_NE(layer.handler.GetObjectByUserData(9), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, DrawingMayDelete) {
+  first.onDraw = [&] { layer.handler.DeleteObject(&second); };
+  layer.handler.Draw(nullptr);
+  EXPECT_EQ(layer.Take(), (Lines{"1: draw", "OnDeleteObject 2", "2: end", "3: draw"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, DrawingMayDeleteTheActiveObject) {
+  layer.Down(25, 5);
+  layer.Take();
+  first.onDraw = [&] { layer.handler.DeleteActive(); };
+  layer.handler.Draw(nullptr);
+  EXPECT_EQ(layer.Take(), (Lines{"1: draw", "OnDeleteObject 3", "3: end", "2: draw"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, ObjectAddedWhileDrawingIsDrawnNextTime) {
+  RecordingView added(layer.lines, "added");
+  first.onDraw = [&] {
+    first.onDraw = nullptr;
+    layer.handler.AddObject(&added);
+  };
+  layer.handler.Draw(nullptr);
+  EXPECT_EQ(layer.Take(), (Lines{"1: draw", "added: to view", "2: draw", "3: draw"}));
+  layer.handler.Draw(nullptr);
+  EXPECT_EQ(layer.Take(), (Lines{"1: draw", "2: draw", "3: draw", "added: draw"}));
+}
+
+TEST_F(GraphicHandlerCallbacks, SelectingMayDeleteTheOneThatIsAsked) {
+  first.recordsEnd = false;
+  RecordingView foreign(layer.lines, "foreign");
+  layer.handler.AddObject(&foreign);
+  foreign.onAsk = [&] { layer.handler.DeleteObject(&foreign); };
+  dVect2D p(2, 2);
+  EXPECT_TRUE(layer.handler.SelectObject(0, p));
+  EXPECT_EQ(layer.handler.GetActiveObject(), &first) << "not one that has left the list";
+  layer.handler.AddObject(&foreign);
+  layer.handler.DeleteObject(&first);
+  EXPECT_EQ(layer.handler.HitTest(p, 0), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, CreationMayDeleteTheObject) {
+  layer.handler.onCreate = [&](RecordingView& view) { view.SetInterface(&layer.viewClient); };
+  layer.client.actions["OnCreateObject"] = [](GraphicHandler* handler, VGObjectView* object) {
+    handler->DeleteObject(object);
+  };
+  layer.handler.SetCreateMode(VGType_Line, -1);
+  EXPECT_TRUE(layer.Down(90, 90));
+  EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "new: to view", "new: create 4098 1 (90, 90)",
+                                 "OnCreateObject 99", "OnDeleteObject 99", "new: end"}));
+  EXPECT_EQ(layer.handler.GetActiveObject(), nullptr);
+}
+
+TEST_F(GraphicHandlerCallbacks, ObjectDeletedByItsFirstClickIsNotReported) {
+  layer.handler.onCreate = [&](RecordingView& view) {
+    view.SetViewState(VGViewState_Visible);  // so the click grabs it instead of creating it
+    view.SetInterface(&layer.viewClient);
+  };
+  layer.viewClient.actions["OnBeginGraphicOp"] = [&](VGObjectView* object) {
+    layer.handler.DeleteObject(object);
+  };
+  layer.handler.DeleteAll();
+  layer.Take();
+  layer.handler.SetCreateMode(VGType_Line, -1);
+  EXPECT_TRUE(layer.Down(5, 5));
+  EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "new: to view", "new: move (5, 5)",
+                                 "OnBeginGraphicOp 99 8", "OnDeleteObject 99", "new: end"}));
+}
+
+}  // namespace

@@ -1,0 +1,440 @@
+#include <vorl/GUI/VGObjectView.h>
+
+#include <gtest/gtest.h>
+
+#include "HandlerTesting.h"
+
+namespace {
+
+using gui_testing::Lines;
+using gui_testing::RecordingView;
+using gui_testing::RecordingViewClient;
+
+constexpr int kDown = 4098;
+constexpr int kMove = 4097;
+constexpr int kUp = 4099;
+
+/// Overrides no more than it must.
+class BareView : public VGObjectView {
+ public:
+  VGType GetObjType() override { return VGType_None; }
+  void Transform(bool toGraphic) override { (toGraphic ? written : refreshed) += 1; }
+  void CalcBoundingBox(HDC /*dc*/, dVect2D& /*min*/, dVect2D& /*max*/) override {}
+  using VGObjectView::AssignViewState;
+  using VGObjectView::GetHandleDistance;
+  using VGObjectView::GetLineDistance;
+  using VGObjectView::SetOpState;
+  int refreshed = 0;
+  int written = 0;
+};
+
+bool Send(VGObjectView& view, int event, int flags = MK_LBUTTON) {
+  dVect2D p(3, 4);
+  return view.ProcessMouseEvent(event, flags, p);
+}
+
+TEST(VGType, NumbersTheClasses) {
+  EXPECT_EQ(VGType_None, 0);
+  EXPECT_EQ(VGType_Point, 1);
+  EXPECT_EQ(VGType_Line, 2);
+  EXPECT_EQ(VGType_Rect, 3);
+  EXPECT_EQ(VGType_Bitmap, 4);
+  EXPECT_EQ(VGType_Text, 7);
+  EXPECT_EQ(VGType_Axis, 8);
+  EXPECT_EQ(VGType_Curve, 9);
+  EXPECT_EQ(VGType_CrossCursor, 10);
+}
+
+TEST(VGObjectView, StartsInvisibleWithNothingAllowed) {
+  BareView view;
+  for (int bit = 1; bit <= 0x4000; bit *= 2) {
+    EXPECT_FALSE(view.IsEnabled(static_cast<short>(bit))) << bit;
+  }
+  EXPECT_FALSE(view.IsDynamicCreated());
+  EXPECT_FALSE(view.IsVisible());
+  EXPECT_FALSE(view.IsSelected());
+  EXPECT_EQ(view.GetOpState(), 0);
+  EXPECT_EQ(view.GetUserData(), 0);
+  EXPECT_EQ(view.GetInterface(), nullptr);
+  EXPECT_EQ(view.GetPenStyle(), 0);
+  EXPECT_EQ(view.GetPenThickness(), 1);
+  EXPECT_EQ(view.GetPenColor(), 0);
+  EXPECT_EQ(view.GetROPMode(), 13);
+  EXPECT_EQ(view.GetLineDistance(), 2);
+  EXPECT_EQ(view.GetHandleDistance(), 4);
+}
+
+TEST(VGObjectView, IdIsTheAddressUntilItIsSet) {
+  BareView view;
+  EXPECT_EQ(view.GetObjID(),
+            static_cast<long>(reinterpret_cast<std::uintptr_t>(static_cast<VGObjectView*>(&view))));
+  view.SetObjID(17);
+  EXPECT_EQ(view.GetObjID(), 17);
+}
+
+TEST(VGObjectView, DefaultTransformationIsOneSharedIdentity) {
+  BareView a;
+  BareView b;
+  ASSERT_NE(a.GetTransformation(), nullptr);
+  EXPECT_EQ(a.GetTransformation(), b.GetTransformation());
+  const auto* identity = dynamic_cast<Translate2D*>(a.GetTransformation());
+  ASSERT_NE(identity, nullptr);
+  EXPECT_EQ(identity->GetTx(), 0);
+  EXPECT_EQ(identity->GetTy(), 0);
+}
+
+TEST(VGObjectView, SetTransformationRefreshesTheViewGeometry) {
+  BareView view;
+  Trafo2DBase* const identity = view.GetTransformation();
+  Translate2D trafo(1, 2);
+  view.SetTransformation(&trafo);
+  EXPECT_EQ(view.GetTransformation(), &trafo);
+  EXPECT_EQ(view.refreshed, 1);
+  view.SetTransformation(nullptr);
+  EXPECT_EQ(view.GetTransformation(), identity);
+  EXPECT_EQ(view.refreshed, 2);
+  EXPECT_EQ(view.written, 0);
+}
+
+TEST(VGObjectView, ViewDataChangedWritesTheGeometryBack) {
+  BareView view;
+  view.ViewDataChanged();
+  EXPECT_EQ(view.written, 1);
+  EXPECT_EQ(view.refreshed, 0);
+}
+
+TEST(VGObjectView, ViewStateBitsAreSetAndCleared) {
+  BareView view;
+  view.SetViewState(2);
+  EXPECT_TRUE(view.IsVisible());
+  EXPECT_FALSE(view.IsSelected());
+  view.SetViewState(1);
+  EXPECT_TRUE(view.IsVisible());
+  EXPECT_TRUE(view.IsSelected());
+  view.ResetViewState(2);
+  EXPECT_FALSE(view.IsVisible());
+  EXPECT_TRUE(view.IsSelected());
+  view.Select(false);
+  EXPECT_FALSE(view.IsSelected());
+  view.Select(true);
+  EXPECT_TRUE(view.IsSelected());
+}
+
+TEST(VGObjectView, IsEnabledAsksForAllBits) {
+  BareView view;
+  view.Enable(4 | 8);
+  EXPECT_TRUE(view.IsEnabled(4));
+  EXPECT_TRUE(view.IsEnabled(4 | 8));
+  EXPECT_FALSE(view.IsEnabled(4 | 16));
+  EXPECT_TRUE(view.IsEnabled(0));
+  view.Disable(4);
+  EXPECT_FALSE(view.IsEnabled(4));
+  EXPECT_TRUE(view.IsEnabled(8));
+}
+
+TEST(VGObjectView, DynamicCreationIsAnEnableBit) {
+  BareView view;
+  view.SetDynamicCreationFlag();
+  EXPECT_TRUE(view.IsDynamicCreated());
+  EXPECT_TRUE(view.IsEnabled(static_cast<short>(0x8000)));
+  EXPECT_FALSE(view.IsEnabled(0x4000));
+}
+
+TEST(VGObjectView, DrawParametersAreSetTogetherAndAlone) {
+  BareView view;
+  view.SetDrawParams(2, 3, 0x00FF80, 7);
+  EXPECT_EQ(view.GetPenStyle(), 2);
+  EXPECT_EQ(view.GetPenThickness(), 3);
+  EXPECT_EQ(view.GetPenColor(), 0x00FF80);
+  EXPECT_EQ(view.GetROPMode(), 7);
+  view.SetPenStyle(1);
+  view.SetPenThickness(9);
+  view.SetPenColor(5);
+  view.SetROPMode(13);
+  EXPECT_EQ(view.GetPenStyle(), 1);
+  EXPECT_EQ(view.GetPenThickness(), 9);
+  EXPECT_EQ(view.GetPenColor(), 5);
+  EXPECT_EQ(view.GetROPMode(), 13);
+}
+
+TEST(VGObjectView, SelectionDistancesHoldAByte) {
+  BareView view;
+  view.SetSelectionDistances(0, 255);
+  EXPECT_EQ(view.GetLineDistance(), 0);
+  EXPECT_EQ(view.GetHandleDistance(), 255);
+}
+
+TEST(VGObjectView, HandlersAndQuestionsAreFalseByDefault) {
+  BareView view;
+  dVect2D p;
+  EXPECT_FALSE(view.IsPointOnGraphic(p, 100));
+  EXPECT_EQ(view.GetSelectionState(MK_LBUTTON, p), 0);
+  EXPECT_FALSE(view.OnCreate(kDown, MK_LBUTTON, p));
+  using Handler = bool (VGObjectView::*)(dVect2D&);
+  const Handler handlers[] = {
+      &VGObjectView::OnBeginMove,   &VGObjectView::OnMove,   &VGObjectView::OnEndMove,
+      &VGObjectView::OnBeginResize, &VGObjectView::OnResize, &VGObjectView::OnEndResize,
+      &VGObjectView::OnBeginModify, &VGObjectView::OnModify, &VGObjectView::OnEndModify,
+      &VGObjectView::OnBeginRotate, &VGObjectView::OnRotate, &VGObjectView::OnEndRotate};
+  for (const Handler handler : handlers) {
+    EXPECT_FALSE((view.*handler)(p));
+  }
+}
+
+TEST(VGObjectView, IntegerPointsAreTakenAsNumbers) {
+  Lines lines;
+  RecordingView view(lines, "v", 5, 5);
+  tagPOINT corner{5, 5};
+  tagPOINT outside{4, 5};
+  EXPECT_TRUE(view.IsPointOnGraphic(corner, 0));
+  EXPECT_FALSE(view.IsPointOnGraphic(outside, 0));
+  EXPECT_TRUE(view.IsPointOnGraphic(outside, 1));
+  EXPECT_EQ(view.GetSelectionState(0, corner), 8);
+  EXPECT_EQ(view.GetSelectionState(0, outside), 0);
+  view.Enable(8);
+  EXPECT_TRUE(static_cast<VGObjectView&>(view).ProcessMouseEvent(kDown, MK_LBUTTON, corner));
+  EXPECT_EQ(lines, Lines{"v: move (5, 5)"});
+}
+
+TEST(VGObjectView, BoundingBoxGrowsInEachComponent) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  dVect2D min(2, 2);
+  dVect2D max(4, 4);
+  view.UpdateBoundingBox(dVect2D(3, 3), min, max);
+  EXPECT_EQ(gui_testing::Text(min) + gui_testing::Text(max), "(2, 2)(4, 4)");
+  view.UpdateBoundingBox(dVect2D(1, 5), min, max);
+  EXPECT_EQ(gui_testing::Text(min) + gui_testing::Text(max), "(1, 2)(4, 5)");
+  view.UpdateBoundingBox(dVect2D(6, -1), min, max);
+  EXPECT_EQ(gui_testing::Text(min) + gui_testing::Text(max), "(1, -1)(6, 5)");
+}
+
+TEST(VGObjectView, DrawsHandlesOverTheVisibleSelectedObject) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.Draw(nullptr);
+  EXPECT_EQ(lines, Lines{"v: draw"});
+  lines.clear();
+  view.Select(true);
+  view.Draw(nullptr);
+  EXPECT_EQ(lines, (Lines{"v: draw", "v: draw selection"}));
+  lines.clear();
+  view.ResetViewState(2);
+  view.Draw(nullptr);
+  EXPECT_EQ(lines, Lines{});
+}
+
+TEST(VGObjectView, FirstLeftClickBeginsCreation) {
+  BareView view;
+  view.Enable(1);
+  EXPECT_FALSE(Send(view, kDown, MK_RBUTTON));
+  EXPECT_FALSE(Send(view, kMove));
+  EXPECT_FALSE(view.IsVisible());
+  Send(view, kDown, MK_LBUTTON | MK_SHIFT);
+  EXPECT_TRUE(view.IsVisible());
+  EXPECT_FALSE(view.IsSelected());
+  EXPECT_EQ(view.GetOpState(), 1);
+}
+
+TEST(VGObjectView, CreationTakesAllThreeEventsAndTellsNobody) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  RecordingViewClient client(lines);
+  view.SetInterface(&client);
+  view.ResetViewState(2);
+  view.Enable(1);
+  EXPECT_TRUE(Send(view, kDown));
+  EXPECT_TRUE(Send(view, kMove, 0));
+  EXPECT_TRUE(Send(view, kUp));
+  EXPECT_EQ(lines, (Lines{"v: create 4098 1 (3, 4)", "v: create 4097 0 (3, 4)",
+                          "v: create 4099 1 (3, 4)"}));
+  EXPECT_FALSE(Send(view, 5000));
+  view.answer = false;
+  EXPECT_FALSE(Send(view, kMove));
+}
+
+TEST(VGObjectView, CreationNeedsItsBitAndAnUntouchedState) {
+  Lines lines;
+  RecordingView forbidden(lines, "v");
+  forbidden.ResetViewState(2);
+  EXPECT_FALSE(Send(forbidden, kDown));
+  RecordingView selected(lines, "v");
+  selected.ResetViewState(2);
+  selected.Select(true);
+  selected.Enable(1);
+  EXPECT_FALSE(Send(selected, kDown));
+  EXPECT_FALSE(selected.IsVisible());
+  EXPECT_EQ(lines, Lines{});
+}
+
+struct OperationCase {
+  short operation;
+  const char* down;
+  const char* move;
+  const char* up;
+};
+
+class VGObjectViewOperation : public ::testing::TestWithParam<OperationCase> {};
+
+TEST_P(VGObjectViewOperation, RunsFromDownToUp) {
+  const OperationCase& expected = GetParam();
+  const std::string number = " 7 " + std::to_string(expected.operation);
+  Lines lines;
+  RecordingView view(lines, "v");
+  RecordingViewClient client(lines);
+  view.SetInterface(&client);
+  view.SetUserData(7);
+  view.grabbedFor = expected.operation;
+  view.Enable(expected.operation);
+  EXPECT_FALSE(Send(view, kMove));
+  EXPECT_TRUE(Send(view, kDown));
+  EXPECT_EQ(view.GetOpState(), expected.operation);
+  EXPECT_FALSE(Send(view, 4096));
+  EXPECT_TRUE(Send(view, kMove, 0));
+  EXPECT_TRUE(Send(view, kUp, 0));
+  EXPECT_EQ(view.GetOpState(), 0);
+  EXPECT_FALSE(Send(view, kUp));
+  EXPECT_EQ(lines, (Lines{expected.down, "OnBeginGraphicOp" + number, expected.move,
+                          "OnGraphicChanged" + number, expected.up, "OnEndGraphicOp" + number}));
+}
+
+TEST_P(VGObjectViewOperation, ReturnsWhatItsHandlerReturns) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  RecordingViewClient client(lines);
+  view.SetInterface(&client);
+  view.grabbedFor = GetParam().operation;
+  view.Enable(GetParam().operation);
+  view.answer = false;
+  EXPECT_FALSE(Send(view, kDown));
+  EXPECT_FALSE(Send(view, kMove));
+  EXPECT_FALSE(Send(view, kUp));
+  EXPECT_EQ(lines.size(), 6u) << "the interface is told all the same";
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    All, VGObjectViewOperation,
+    ::testing::Values(
+        OperationCase{4, "v: modify (3, 4)", "v: modifying (3, 4)", "v: modified (3, 4)"},
+        OperationCase{8, "v: move (3, 4)", "v: moving (3, 4)", "v: moved (3, 4)"},
+        OperationCase{16, "v: resize (3, 4)", "v: resizing (3, 4)", "v: resized (3, 4)"},
+        OperationCase{32, "v: rotate (3, 4)", "v: rotating (3, 4)", "v: rotated (3, 4)"}),
+    [](const auto& instance) { return "Operation" + std::to_string(instance.param.operation); });
+
+TEST(VGObjectView, HandleThatIsNotAllowedMovesInstead) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.grabbedFor = 32;
+  view.Enable(8);
+  EXPECT_TRUE(Send(view, kDown));
+  EXPECT_EQ(view.GetOpState(), 8);
+  EXPECT_EQ(lines, Lines{"v: move (3, 4)"});
+}
+
+TEST(VGObjectView, NothingBeginsWhereNothingIsAllowed) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.grabbedFor = 32;
+  EXPECT_FALSE(Send(view, kDown));
+  EXPECT_EQ(view.GetOpState(), 0);
+}
+
+TEST(VGObjectView, ClickBesideTheObjectBeginsNothing) {
+  Lines lines;
+  RecordingView view(lines, "v", 50, 50);
+  view.Enable(8);
+  EXPECT_FALSE(Send(view, kDown));
+  EXPECT_EQ(view.GetOpState(), 0);
+}
+
+TEST(VGObjectView, OtherButtonsBeginNothing) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.Enable(8);
+  EXPECT_FALSE(Send(view, kDown, MK_RBUTTON));
+  EXPECT_FALSE(Send(view, kDown, MK_MBUTTON));
+  EXPECT_EQ(lines, Lines{});
+}
+
+TEST(VGObjectView, RunningOperationIsNotChosenAnew) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.Enable(8 | 16);
+  Send(view, kDown);
+  view.grabbedFor = 16;
+  EXPECT_TRUE(Send(view, kDown));
+  EXPECT_EQ(lines, (Lines{"v: move (3, 4)", "v: move (3, 4)"}));
+}
+
+TEST(VGObjectView, UnknownOperationTakesNoEvents) {
+  BareView view;
+  view.AssignViewState(2);
+  view.SetOpState(2);
+  EXPECT_FALSE(Send(view, kDown));
+  EXPECT_FALSE(Send(view, kMove));
+  EXPECT_FALSE(Send(view, kUp));
+}
+
+TEST(VGObjectView, InvisibleObjectTakesNoEvents) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  view.Enable(8);
+  Send(view, kDown);
+  lines.clear();
+  view.ResetViewState(2);
+  EXPECT_FALSE(Send(view, kMove));
+  EXPECT_EQ(lines, Lines{});
+}
+
+TEST(VGObjectView, CopyIsAnObjectOfItsOwn) {
+  Lines lines;
+  RecordingViewClient client(lines);
+  BareView view;
+  Translate2D trafo(1, 2);
+  view.SetTransformation(&trafo);
+  view.SetDynamicCreationFlag();
+  view.Enable(8);
+  view.SetUserData(3);
+  view.SetInterface(&client);
+  view.SetDrawParams(1, 2, 3, 7);
+  view.SetSelectionDistances(5, 6);
+  view.SetViewState(3);
+  view.SetOpState(8);
+  BareView copy(view);
+  EXPECT_NE(copy.GetObjID(), view.GetObjID());
+  EXPECT_FALSE(copy.IsDynamicCreated());
+  EXPECT_TRUE(copy.IsEnabled(8));
+  EXPECT_EQ(copy.GetUserData(), 3);
+  EXPECT_EQ(copy.GetInterface(), &client);
+  EXPECT_EQ(copy.GetTransformation(), &trafo);
+  EXPECT_EQ(copy.GetPenStyle(), 1);
+  EXPECT_EQ(copy.GetPenThickness(), 2);
+  EXPECT_EQ(copy.GetPenColor(), 3);
+  EXPECT_EQ(copy.GetROPMode(), 7);
+  EXPECT_EQ(copy.GetLineDistance(), 5);
+  EXPECT_EQ(copy.GetHandleDistance(), 6);
+  EXPECT_TRUE(copy.IsVisible());
+  EXPECT_TRUE(copy.IsSelected());
+  EXPECT_EQ(copy.GetOpState(), 8);
+  view.SetObjID(44);
+  EXPECT_EQ(BareView(view).GetObjID(), 44);
+}
+
+TEST(VGObjectView, AssignmentKeepsThePlace) {
+  Translate2D trafo(1, 2);
+  Translate2D otherTrafo(3, 4);
+  BareView view;
+  view.SetTransformation(&trafo);
+  view.SetDynamicCreationFlag();
+  const long id = view.GetObjID();
+  BareView other;
+  other.SetTransformation(&otherTrafo);
+  other.Enable(16);
+  view = other;
+  EXPECT_TRUE(view.IsDynamicCreated());
+  EXPECT_TRUE(view.IsEnabled(16));
+  EXPECT_EQ(view.GetTransformation(), &trafo);
+  EXPECT_EQ(view.GetObjID(), id);
+}
+
+}  // namespace

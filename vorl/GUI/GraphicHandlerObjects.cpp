@@ -1,0 +1,413 @@
+// The list of a handler's objects.
+//
+// Whatever the handler calls may delete objects, so nothing here trusts a pointer across a call:
+//
+// 1. Each object knows the handlers that list it (it is registered with them), and has them forget
+//    it when it is destroyed.
+// 2. Each loop that calls the application's code is a walk, during which deleted objects leave
+//    empty places, so that the others keep theirs; new ones are appended. When the last walk ends,
+//    the empty places go.
+
+#include <algorithm>
+#include <new>
+
+#include <vorl/GUI/GraphicHandler.h>
+
+inline namespace vorl {
+
+/// Keeps every object in its place.
+class GraphicHandler::Walk {
+ public:
+  explicit Walk(GraphicHandler& handler) : m_handler(handler), m_end(handler.m_list.size()) {
+    ++m_handler.m_walks;
+  }
+  Walk(const Walk&) = delete;
+  Walk& operator=(const Walk&) = delete;
+  ~Walk() {
+    if (--m_handler.m_walks == 0) {
+      std::erase_if(m_handler.m_list, [](const Entry& entry) { return entry.object == nullptr; });
+    }
+  }
+  /// Behind the last place that there was at the start.
+  std::size_t End() const { return m_end; }
+
+ private:
+  GraphicHandler& m_handler;
+  std::size_t m_end;
+};
+
+/// An object that is about to be destroyed, as long as nobody else has done it.
+class GraphicHandler::Doomed {
+ public:
+  Doomed(GraphicHandler& handler, VGObjectView* object)
+      : m_handler(handler), m_outer(handler.m_pDoomed), m_object(object) {
+    handler.m_pDoomed = this;
+  }
+  Doomed(const Doomed&) = delete;
+  Doomed& operator=(const Doomed&) = delete;
+  ~Doomed() { m_handler.m_pDoomed = m_outer; }
+
+  Doomed* Outer() const { return m_outer; }
+  VGObjectView* Object() const { return m_object; }
+  void Reset() { m_object = nullptr; }
+
+ private:
+  GraphicHandler& m_handler;
+  Doomed* m_outer;
+  VGObjectView* m_object;
+};
+
+GraphicHandler::GraphicHandler() = default;
+
+GraphicHandler::GraphicHandler(const GraphicHandler& source) : InputEventHandler(source) {
+  CopyState(source);
+}
+
+GraphicHandler& GraphicHandler::operator=(const GraphicHandler& source) {
+  if (this != &source) {
+    InputEventHandler::operator=(source);
+    DeleteWhere([&](const VGObjectView& object) { return !source.IsRegistered(&object); });
+    CopyState(source);
+  }
+  return *this;
+}
+
+GraphicHandler::~GraphicHandler() {
+  m_pInterface = nullptr;
+  DeleteWhere([](const VGObjectView&) { return true; });
+  for (const Entry& entry : m_list) {
+    Unregister(entry.object);  // added meanwhile by the destructor of an object
+  }
+}
+
+void GraphicHandler::CopyState(const GraphicHandler& source) {
+  if (!CopyList(source)) {
+    DeleteWhere([](const VGObjectView&) { return true; });
+  }
+  m_flags = source.m_flags;
+  m_pActive = IsListed(source.m_pActive) ? source.m_pActive : nullptr;
+  m_createMode = source.m_createMode;
+  m_createID = source.m_createID;
+  // The viewport that the source's map belongs to knows nothing of this handler, and could not tell
+  // it when the map goes.
+  m_pTrafo = nullptr;
+  m_unitTrafoX = source.m_unitTrafoX;
+  m_unitTrafoY = source.m_unitTrafoY;
+  m_pInterface = source.m_pInterface;
+}
+
+// Replaces the list by the source's, which holds all that is in it. False without memory.
+bool GraphicHandler::CopyList(const GraphicHandler& source) {
+  const Walk walk(*this);
+  for (const Entry& entry : source.m_list) {
+    if (entry.object != nullptr && !Append(entry.object, !Owns(entry.object))) {
+      return false;
+    }
+  }
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView*& object = m_list[i].object;
+    if (object != nullptr && !source.IsRegistered(object)) {
+      Unregister(object);  // added when the others were deleted
+    }
+    object = nullptr;
+  }
+  return true;
+}
+
+bool GraphicHandler::IsEmpty() const {
+  return std::none_of(m_list.begin(), m_list.end(),
+                      [](const Entry& entry) { return entry.object != nullptr; });
+}
+
+bool GraphicHandler::IsListed(const VGObjectView* object) const {
+  return object != nullptr && std::any_of(m_list.begin(), m_list.end(), [&](const Entry& entry) {
+           return entry.object == object;
+         });
+}
+
+bool GraphicHandler::Owns(const VGObjectView* object) const {
+  return IsRegistered(object) && std::any_of(m_list.begin(), m_list.end(), [&](const Entry& entry) {
+           return entry.object == object && !entry.isBorrowed;
+         });
+}
+
+bool GraphicHandler::IsDoomed(const VGObjectView* object) const {
+  const Doomed* doomed = m_pDoomed;
+  while (doomed != nullptr && doomed->Object() != object) {
+    doomed = doomed->Outer();
+  }
+  return doomed != nullptr;
+}
+
+bool GraphicHandler::IsRegistered(const VGObjectView* object) const {
+  return std::find(object->m_handlers.begin(), object->m_handlers.end(), this) !=
+         object->m_handlers.end();
+}
+
+// False without memory.
+bool GraphicHandler::Register(VGObjectView* object) {
+  if (IsRegistered(object)) {
+    return true;
+  }
+  try {
+    object->m_handlers.push_back(this);
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+  return true;
+}
+
+void GraphicHandler::Unregister(VGObjectView* object) {
+  std::erase(object->m_handlers, this);
+}
+
+void GraphicHandler::Forget(VGObjectView* object) {
+  const Walk walk(*this);
+  for (Entry& entry : m_list) {
+    if (entry.object == object) {
+      entry.object = nullptr;
+    }
+  }
+  if (m_pActive == object) {
+    m_pActive = nullptr;
+  }
+  for (Doomed* doomed = m_pDoomed; doomed != nullptr; doomed = doomed->Outer()) {
+    if (doomed->Object() == object) {
+      doomed->Reset();
+    }
+  }
+}
+
+bool GraphicHandler::Append(VGObjectView* object, bool isBorrowed) {
+  const bool isRepeated = IsRegistered(object) && IsListed(object);
+  if (!Register(object)) {
+    return false;
+  }
+  try {
+    m_list.push_back({object, isBorrowed});
+  } catch (const std::bad_alloc&) {
+    if (!isRepeated && m_pActive != object) {
+      Unregister(object);
+    }
+    return false;
+  }
+  m_mayRepeat = m_mayRepeat || isRepeated;
+  return true;
+}
+
+bool GraphicHandler::AddObject(VGObjectView* object) {
+  if (object == nullptr || IsDoomed(object)) {
+    return false;
+  }
+  object->SetTransformation(m_pTrafo);
+  return Append(object, false);
+}
+
+void GraphicHandler::SetTransformation(Trafo2DBase* trafo) {
+  if (trafo == m_pTrafo) {
+    return;
+  }
+  m_pTrafo = trafo;
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    if (VGObjectView* const object = m_list[i].object) {
+      object->SetTransformation(m_pTrafo);
+    }
+  }
+}
+
+void GraphicHandler::DrawObjects(HDC dc, GraphicViewPort* viewPort) {
+  if (!IsEnabled(GraphicHandlerFlag_Visible)) {
+    return;
+  }
+  const auto draw = [&](VGObjectView& object) {
+    if (viewPort != nullptr) {
+      object.Draw(dc, *viewPort);
+    } else {
+      object.Draw(dc);
+    }
+  };
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView* const object = m_list[i].object;
+    if (object != nullptr && object != m_pActive) {
+      draw(*object);
+    }
+  }
+  if (m_pActive != nullptr) {
+    draw(*m_pActive);
+  }
+  GdiFlush();
+}
+
+bool GraphicHandler::SelectObject(int flags, dVect2D& point) {
+  if (!IsInteractive()) {
+    return false;
+  }
+  if (m_pActive != nullptr) {
+    m_pActive->Select(false);
+    m_pActive = nullptr;
+  }
+  // The walk does not stop at a hit: all objects under the mouse are selected, and the last of
+  // them, which is drawn above the others, becomes the active one.
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView* const object = m_list[i].object;
+    if (object != nullptr && object->GetSelectionState(flags, point) != 0 &&
+        m_list[i].object == object) {
+      m_pActive = object;
+      object->Select(true);
+    }
+  }
+  return m_pActive != nullptr;
+}
+
+void GraphicHandler::CalcBoundingBox(HDC dc, dVect2D& min, dVect2D& max) {
+  min.Set(0, 0);
+  max.Set(0, 0);
+  bool isFirst = true;
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView* const object = m_list[i].object;
+    if (object == nullptr) {
+      continue;
+    }
+    dVect2D low;
+    dVect2D high;
+    object->CalcBoundingBox(dc, low, high);
+    if (isFirst) {
+      min = low;
+      max = high;
+      isFirst = false;
+      continue;
+    }
+    min.Set(std::min(min.x, low.x), std::min(min.y, low.y));
+    max.Set(std::max(max.x, high.x), std::max(max.y, high.y));
+  }
+}
+
+template <typename Predicate>
+VGObjectView* GraphicHandler::Find(Predicate predicate) {
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView* const object = m_list[i].object;
+    if (object != nullptr && predicate(*object) && m_list[i].object == object) {
+      return object;
+    }
+  }
+  return nullptr;
+}
+
+VGObjectView* GraphicHandler::GetObject(VGType type, long id) {
+  return Find(
+      [=](VGObjectView& object) { return object.GetObjID() == id && object.GetObjType() == type; });
+}
+
+VGObjectView* GraphicHandler::GetObject(long id) {
+  return Find([=](const VGObjectView& object) { return object.GetObjID() == id; });
+}
+
+VGObjectView* GraphicHandler::GetObjectByUserData(long data) {
+  return Find([=](const VGObjectView& object) { return object.GetUserData() == data; });
+}
+
+VGObjectView* GraphicHandler::HitTest(dVect2D& point, int tolerance) {
+  if (!IsEnabled(GraphicHandlerFlag_Visible)) {
+    return nullptr;
+  }
+  return Find([&](VGObjectView& object) {
+    return object.IsVisible() && object.IsPointOnGraphic(point, tolerance);
+  });
+}
+
+void GraphicHandler::ClearEntries(const VGObjectView* object) {
+  for (Entry& entry : m_list) {
+    if (entry.object == object) {
+      entry.object = nullptr;
+    }
+  }
+}
+
+// Takes the object out of all its places, and destroys it if it is the handler's. Only in a walk.
+void GraphicHandler::Delete(std::size_t index) {
+  VGObjectView* const object = m_list[index].object;
+  const bool isOwned =
+      object->IsDynamicCreated() && (m_mayRepeat ? Owns(object) : !m_list[index].isBorrowed);
+  m_list[index].object = nullptr;
+  if (m_mayRepeat) {
+    ClearEntries(object);
+  }
+  if (m_pActive == object) {
+    m_pActive = nullptr;
+  }
+  if (!isOwned) {
+    Unregister(object);
+    return;
+  }
+  const Doomed doomed(*this, object);
+  if (m_pInterface != nullptr) {
+    m_pInterface->OnDeleteObject(this, object);
+  }
+  if (doomed.Object() != nullptr) {
+    Unregister(object);
+    delete object;
+  }
+}
+
+template <typename Predicate>
+bool GraphicHandler::DeleteWhere(Predicate predicate) {
+  bool isAnyDeleted = false;
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < walk.End(); ++i) {
+    VGObjectView* const object = m_list[i].object;
+    if (object != nullptr && predicate(*object) && m_list[i].object == object) {
+      Delete(i);
+      isAnyDeleted = true;
+    }
+  }
+  return isAnyDeleted;
+}
+
+bool GraphicHandler::DeleteObject(long id) {
+  VGObjectView* const object = GetObject(id);
+  return object != nullptr && DeleteObject(object);
+}
+
+bool GraphicHandler::DeleteObject(VGObjectView* object) {
+  if (object == nullptr || IsEmpty()) {
+    return false;
+  }
+  const Walk walk(*this);
+  for (std::size_t i = 0; i < m_list.size(); ++i) {
+    if (m_list[i].object == object) {
+      Delete(i);
+      break;
+    }
+  }
+  return true;
+}
+
+bool GraphicHandler::DeleteObjects(VGType type, long id) {
+  return DeleteWhere([=](VGObjectView& object) {
+    if (id != -1 && object.GetObjID() != id) {
+      return false;
+    }
+    const VGType own = object.GetObjType();
+    return own == type || own == VGType_None;
+  });
+}
+
+bool GraphicHandler::DeleteAll() {
+  DeleteWhere([](const VGObjectView&) { return true; });
+  return true;
+}
+
+bool GraphicHandler::DeleteSelected() {
+  return DeleteWhere([](const VGObjectView& object) { return object.IsSelected(); });
+}
+
+bool GraphicHandler::DeleteActive() {
+  return DeleteObject(m_pActive);
+}
+
+}  // namespace vorl

@@ -1,0 +1,202 @@
+// The handlers that a viewport shows, and drawing them.
+
+#include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/GraphicViewPort.h>
+
+#include <algorithm>
+#include <new>
+
+#include <vorl/GUI/detail/Truncated.h>
+
+inline namespace vorl {
+
+using vorl_detail::Truncated;
+
+namespace {
+
+void IntersectClip(HDC dc, const tagRECT& rect) {
+  IntersectClipRect(dc, rect.left, rect.top, rect.right, rect.bottom);
+}
+
+void ExcludeClip(HDC dc, const tagRECT& rect) {
+  ExcludeClipRect(dc, rect.left, rect.top, rect.right, rect.bottom);
+}
+
+/// Fills what the clip region leaves of a rectangle.
+void Fill(HDC dc, const tagRECT& rect, std::uint32_t color) {
+  const HBRUSH brush = CreateSolidBrush(color);
+  if (brush != nullptr) {
+    FillRect(dc, &rect, brush);
+    DeleteObject(brush);
+  }
+}
+
+/// What borders leave of a window: nothing when they overlap. A mirrored window stays mirrored.
+void EmptyWhereBordersOverlap(const tagRECT& view, tagRECT& draw) {
+  if (view.left <= view.right && draw.right < draw.left) {
+    draw.right = draw.left;
+  }
+  if (view.top <= view.bottom && draw.bottom < draw.top) {
+    draw.bottom = draw.top;
+  }
+}
+
+LONG WholePixel(float edge) {
+  return Truncated<LONG>(edge + 0.5);
+}
+
+}  // namespace
+
+GraphicViewPort::HandlerList::HandlerList() = default;
+
+GraphicViewPort::HandlerList::HandlerList(const HandlerList& source)
+    : std::vector<GraphicHandler*>() {
+  *this = source;
+}
+
+GraphicViewPort::HandlerList& GraphicViewPort::HandlerList::operator=(const HandlerList& source) {
+  try {
+    std::vector<GraphicHandler*>::operator=(source);
+  } catch (const std::bad_alloc&) {
+    clear();
+  }
+  return *this;
+}
+
+void GraphicViewPort::SetGraphic(GraphicHandler* graphic) {
+  m_handlers.clear();
+  AddGraphic(graphic);
+}
+
+bool GraphicViewPort::AddGraphic(GraphicHandler* graphic) {
+  if (graphic == nullptr) {
+    return false;
+  }
+  std::erase(m_handlers, graphic);
+  try {
+    m_handlers.push_back(graphic);
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+  return true;
+}
+
+void GraphicViewPort::RemoveGraphic(GraphicHandler* graphic) {
+  if (graphic == nullptr) {
+    m_captured = nullptr;
+    for (std::size_t i = 0; i < m_handlers.size(); ++i) {
+      m_handlers[i]->SetTransformation(nullptr);
+    }
+    m_handlers.clear();
+    return;
+  }
+  if (m_captured == graphic) {
+    m_captured = nullptr;
+  }
+  if (!m_handlers.empty()) {
+    graphic->SetTransformation(nullptr);
+    std::erase(m_handlers, graphic);
+  }
+}
+
+void GraphicViewPort::SetBgColor(long color) {
+  m_bgColor = static_cast<std::uint32_t>(color);
+}
+
+void GraphicViewPort::SetBorderColor(long color) {
+  m_borderColor = static_cast<std::uint32_t>(color);
+}
+
+long GraphicViewPort::GetBgColor() const {
+  return static_cast<long>(m_bgColor);
+}
+
+long GraphicViewPort::GetBorderColor() const {
+  return static_cast<long>(m_borderColor);
+}
+
+void GraphicViewPort::GetDeviceWins(tagRECT& view, tagRECT& draw) const {
+  const dVect2D topLeft = m_viewWin.GetTL();
+  const dVect2D bottomRight = m_viewWin.GetBR();
+  view = {WholePixel(topLeft.x), WholePixel(topLeft.y), WholePixel(bottomRight.x),
+          WholePixel(bottomRight.y)};
+  GetDrawWin(draw);
+  EmptyWhereBordersOverlap(view, draw);
+}
+
+void GraphicViewPort::ClipToWindow(HDC dc) const {
+  tagRECT view;
+  tagRECT draw;
+  GetDeviceWins(view, draw);
+  IntersectClip(dc, IsEnabled(ViewPortFlag_ClipBorders) ? draw : view);
+}
+
+void GraphicViewPort::ClipTo(HDC dc, Rect2D* clip, bool clipIsGraphic) const {
+  if (clip == nullptr) {
+    return;
+  }
+  if (clipIsGraphic) {
+    GraphicToView(*clip);
+  }
+  const dVect2D topLeft = clip->GetTL();
+  const dVect2D bottomRight = clip->GetBR();
+  IntersectClip(dc, {WholePixel(topLeft.x), WholePixel(topLeft.y), WholePixel(bottomRight.x),
+                     WholePixel(bottomRight.y)});
+}
+
+void GraphicViewPort::Draw(HDC dc, GraphicHandler* graphic, Rect2D* clip, bool clipIsGraphic) {
+  if (graphic == nullptr || !IsVisible()) {
+    return;
+  }
+  ClipToWindow(dc);
+  ClipTo(dc, clip, clipIsGraphic);
+  graphic->SetTransformation(&m_trafo);
+  graphic->Draw(dc, *this);
+}
+
+void GraphicViewPort::Draw(HDC dc, Rect2D* clip, bool clipIsGraphic) {
+  if (!IsVisible()) {
+    return;
+  }
+  // Once for all handlers: the clip rectangle is mapped in place.
+  ClipToWindow(dc);
+  ClipTo(dc, clip, clipIsGraphic);
+  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
+    GraphicHandler* const handler = m_handlers[i];
+    handler->SetTransformation(&m_trafo);
+    handler->Draw(dc, *this);
+  }
+}
+
+void GraphicViewPort::DrawActiveObject(HDC dc) {
+  if (m_captured == nullptr || !IsVisible()) {
+    return;
+  }
+  SelectClipRgn(dc, nullptr);
+  ClipToWindow(dc);
+  m_captured->SetTransformation(&m_trafo);
+  m_captured->DrawActiveObject(dc, *this);
+  SelectClipRgn(dc, nullptr);
+}
+
+void GraphicViewPort::EraseBkgnd(HDC dc, Rect2D* clip, bool clipIsGraphic) {
+  if (!IsVisible()) {
+    return;
+  }
+  tagRECT view;
+  tagRECT draw;
+  GetDeviceWins(view, draw);
+  IntersectClip(dc, view);
+  ClipTo(dc, clip, clipIsGraphic);
+  Fill(dc, draw, m_bgColor);
+  if (m_topBorder != 0 || m_bottomBorder != 0 || m_leftBorder != 0 || m_rightBorder != 0) {
+    ExcludeClip(dc, draw);
+    Fill(dc, view, m_borderColor);
+  }
+}
+
+VGObjectView* GraphicViewPort::GetActiveGraphicObject() {
+  return m_captured != nullptr ? m_captured->GetActiveObject() : nullptr;
+}
+
+}  // namespace vorl

@@ -1,0 +1,74 @@
+#ifndef VORL_GUI_DETAIL_SHAPEPEN_H
+#define VORL_GUI_DETAIL_SHAPEPEN_H
+
+/// @file
+/// What the shapes draw with.
+
+#include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/detail/DeviceRect.h>
+#include <vorl/GUI/detail/Truncated.h>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+/// The width of the pen that draws the handles of a line.
+inline int HandleWidth(int thickness) {
+  return ToDevice(std::int64_t{thickness} * 2 + 3);
+}
+
+/// The raster operation of a device context while a shape is drawn.
+class ShapeROP {
+ public:
+  ShapeROP(HDC dc, const VGObjectView& view) : m_dc(dc), m_old(SetROP2(dc, view.GetROPMode())) {}
+  ShapeROP(const ShapeROP&) = delete;
+  ShapeROP& operator=(const ShapeROP&) = delete;
+  ~ShapeROP() {
+    if (m_old != 0) {
+      SetROP2(m_dc, m_old);
+    }
+  }
+
+ private:
+  HDC m_dc;
+  int m_old;
+};
+
+/// A pen of a shape's style and colour in a device context.
+class ShapePen {
+ public:
+  ShapePen(HDC dc, const VGObjectView& view, int width)
+      : m_dc(dc),
+        m_pen(CreatePen(view.GetPenStyle(), width, static_cast<COLORREF>(view.GetPenColor()))),
+        m_old(SelectObject(dc, m_pen)) {}
+  ShapePen(const ShapePen&) = delete;
+  ShapePen& operator=(const ShapePen&) = delete;
+  ~ShapePen() {
+    if (m_old != nullptr) {
+      SelectObject(m_dc, m_old);
+    }
+    DeleteObject(m_pen);
+  }
+
+  void Line(int x1, int y1, int x2, int y2) const {
+    MoveToEx(m_dc, x1, y1, nullptr);
+    LineTo(m_dc, x2, y2);
+  }
+  /// Without decimals.
+  void Line(const dVect2D& start, const dVect2D& end) const {
+    Line(Truncated<int>(start.x), Truncated<int>(start.y), Truncated<int>(end.x),
+         Truncated<int>(end.y));
+  }
+  /// A line without length, which the pen makes as large as it is wide.
+  void Dot(int x, int y) const { Line(x, y, x, y); }
+  void Dot(const dVect2D& pos) const { Line(pos, pos); }
+
+ private:
+  HDC m_dc;
+  HPEN m_pen;
+  HGDIOBJ m_old;
+};
+
+}  // namespace vorl_detail
+}  // namespace vorl
+
+#endif
