@@ -79,6 +79,8 @@ class VGLine;
 class VGLineView;
 class VGObject;
 class VGObjectView;
+class VGPoint;
+class VGPointView;
 class VGRect;
 class VGRectView;
 class vIma2Device;

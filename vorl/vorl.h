@@ -39,6 +39,7 @@
 #include <vorl/GUI/Trafo2D.h>
 #include <vorl/GUI/VGLine.h>
 #include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/VGPoint.h>
 #include <vorl/GUI/VGRect.h>
 #include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>

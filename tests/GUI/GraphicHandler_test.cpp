@@ -85,6 +85,40 @@ TEST(GraphicHandler, DrawsTheActiveObjectAlone) {
   EXPECT_EQ(layer.Take(), (Lines{"2: draw", "2: draw selection"}));
 }
 
+TEST(GraphicHandler, DrawsWithAViewportInTheSameOrder) {
+  Layer layer;
+  GraphicViewPort viewPort;
+  layer.Add(1, 0, 0);
+  layer.Add(2, 20, 0);
+  layer.Down(5, 5);
+  layer.Take();
+  layer.handler.Draw(nullptr, viewPort);
+  EXPECT_EQ(layer.Take(), (Lines{"2: draw", "1: draw", "1: draw selection"}));
+  layer.handler.DrawActiveObject(nullptr, viewPort);
+  EXPECT_EQ(layer.Take(), (Lines{"1: draw", "1: draw selection"}));
+  layer.handler.Disable(1);
+  layer.handler.Draw(nullptr, viewPort);
+  layer.handler.DrawActiveObject(nullptr, viewPort);
+  EXPECT_EQ(layer.Take(), Lines{});
+}
+
+TEST(GraphicHandler, TakesTheWholeWayFromTheViewport) {
+  Layer layer;
+  RecordingView& view = layer.Add(1, 0, 0);
+  GraphicViewPort viewPort(Rect2D(0, 0, 100, 100), Rect2D(0, 0, 100, 100), Rect2D(0, 0, 100, 100));
+  viewPort.AddGraphic(&layer.handler);
+  EXPECT_TRUE(viewPort.ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, tagPOINT{5, 5}));
+  EXPECT_EQ(viewPort.GetActiveGraphicObject(), &view);
+  EXPECT_EQ(view.GetTransformation(), &viewPort.GetTrafo());
+  EXPECT_TRUE(viewPort.ProcessMouseEvent(MouseEvent_Move, MK_LBUTTON, tagPOINT{6, 7}));
+  EXPECT_TRUE(viewPort.ProcessMouseEvent(MouseEvent_ButtonUp, MK_LBUTTON, tagPOINT{6, 7}));
+  EXPECT_EQ(layer.Take(),
+            (Lines{"1: to view", "1: move (5, 5)", "OnSelectObject 1", "1: moving (6, 7)",
+                   "OnModifyObject 1", "1: moved (6, 7)", "OnObjectModified 1"}));
+  viewPort.RemoveGraphic(&layer.handler);
+  EXPECT_NE(view.GetTransformation(), &viewPort.GetTrafo());
+}
+
 TEST(GraphicHandler, HitTestGivesTheFirstVisibleObject) {
   Layer layer;
   RecordingView& first = layer.Add(1, 0, 0);

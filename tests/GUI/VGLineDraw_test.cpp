@@ -55,6 +55,14 @@ TEST(VGLineViewDraw, InfiniteLineReachesAllOfTheClipRegion) {
   EXPECT_EQ(Lit(canvas), expected);
 }
 
+TEST(VGLineViewDraw, OtherTypesAreDrawnInfinite) {
+  Canvas canvas(32, 32);
+  canvas.Fill(0);
+  VGLineView view = LineView(10, 7, 11, 7, static_cast<TLine>(3));
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas).size(), 32u);
+}
+
 TEST(VGLineViewDraw, LineOutsideTheClipRegionIsNotDrawn) {
   Canvas canvas(32, 32);
   canvas.Fill(0);

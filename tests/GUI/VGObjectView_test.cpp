@@ -1,3 +1,4 @@
+#include <vorl/GUI/GraphicViewPort.h>
 #include <vorl/GUI/VGObjectView.h>
 
 #include <gtest/gtest.h>
@@ -221,6 +222,19 @@ TEST(VGObjectView, DrawsHandlesOverTheVisibleSelectedObject) {
   lines.clear();
   view.ResetViewState(2);
   view.Draw(nullptr);
+  EXPECT_EQ(lines, Lines{});
+}
+
+TEST(VGObjectView, ViewportFormsOfDrawingCallTheOthers) {
+  Lines lines;
+  RecordingView view(lines, "v");
+  GraphicViewPort viewPort;
+  view.Select(true);
+  static_cast<VGObjectView&>(view).Draw(nullptr, viewPort);
+  EXPECT_EQ(lines, (Lines{"v: draw", "v: draw selection"}));
+  lines.clear();
+  view.ResetViewState(2);
+  static_cast<VGObjectView&>(view).Draw(nullptr, viewPort);
   EXPECT_EQ(lines, Lines{});
 }
 

@@ -1,0 +1,76 @@
+// What becomes of layers of graphic objects when there is no memory left.
+#include <gtest/gtest.h>
+#include <tests/Support/Allocation.h>
+#include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/VGPoint.h>
+
+namespace {
+
+/// Counts the points there are.
+class CountedPoint : public VGPointView {
+ public:
+  CountedPoint() { ++living; }
+  CountedPoint(const CountedPoint&) = delete;
+  CountedPoint& operator=(const CountedPoint&) = delete;
+  ~CountedPoint() override { --living; }
+
+  static int living;
+};
+
+int CountedPoint::living = 0;
+
+TEST(GraphicsOutOfMemory, ObjectCannotBeAdded) {
+  auto* const object = new CountedPoint();
+  object->SetDynamicCreationFlag();
+  {
+    GraphicHandler handler;
+    {
+      const AllocationFailure failure;
+      EXPECT_FALSE(handler.AddObject(object));
+    }
+    EXPECT_FALSE(handler.DeleteObject(object)) << "the list is empty";
+  }
+  EXPECT_EQ(CountedPoint::living, 1) << "it does not belong to the handler";
+  delete object;
+}
+
+TEST(GraphicsOutOfMemory, CopyIsEmpty) {
+  GraphicHandler handler;
+  VGPointView object;
+  ASSERT_TRUE(handler.AddObject(&object));
+  object.SetObjID(5);
+  GraphicHandler target;
+  {
+    const AllocationFailure failure;
+    GraphicHandler copy(handler);
+    EXPECT_EQ(copy.GetObject(5), nullptr);
+    target = handler;
+  }
+  EXPECT_EQ(target.GetObject(5), nullptr);
+  EXPECT_EQ(handler.GetObject(5), &object);
+  target = handler;
+  EXPECT_EQ(target.GetObject(5), &object);
+}
+
+/// Creates its object beforehand.
+class ReadyHandler : public GraphicHandler {
+ public:
+  VGObjectView* CreateObject(VGType /*type*/) override { return ready; }
+  VGObjectView* ready = nullptr;
+};
+
+TEST(GraphicsOutOfMemory, CreatedObjectThatCannotBeListedIsDestroyed) {
+  ReadyHandler handler;
+  handler.ready = new CountedPoint();
+  handler.ready->SetDynamicCreationFlag();
+  handler.SetCreateMode(VGType_Point, -1);
+  dVect2D p;
+  {
+    const AllocationFailure failure;
+    EXPECT_FALSE(handler.ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, p));
+  }
+  EXPECT_EQ(CountedPoint::living, 0);
+  EXPECT_EQ(handler.GetActiveObject(), nullptr);
+}
+
+}  // namespace
