@@ -47,7 +47,7 @@ inline std::size_t RowBytes(const Bitmap& bitmap) {
 
 inline void Append(Bytes& bytes, std::uint64_t value, int count) {
   for (int i = 0; i < count; ++i) {
-    bytes.push_back(static_cast<unsigned char>(value >> 8 * i & 0xFF));
+    bytes.push_back(i < 8 ? static_cast<unsigned char>(value >> 8 * i & 0xFF) : std::uint8_t{0});
   }
 }
 

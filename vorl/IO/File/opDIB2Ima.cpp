@@ -1,9 +1,9 @@
 #include <vorl/IO/File/opDIB2Ima.h>
 
 #include <algorithm>
+#include <cstdint>
 #include <cstdlib>
 #include <cstring>
-#include <functional>
 #include <limits>
 #include <string>
 
@@ -92,13 +92,13 @@ bool CheckHeader(const BitmapSource& source, dStatus& status) {
   return false;
 }
 
-/// True when the image's pixels and these bytes have any in common.
+/// True when the image's pixels and these bytes have any in common. Addresses are compared as
+/// numbers: so many bytes as a header claims need not exist.
 bool SharesBytes(const dImage& image, const void* bytes, std::uint64_t size) {
-  const std::less<const unsigned char*> before;
-  const auto* first = static_cast<const unsigned char*>(bytes);
-  const auto* pixels = static_cast<const unsigned char*>(image.GetDataPtr());
-  return pixels != nullptr && before(pixels, first + size) &&
-         before(first, pixels + image.GetImageSize());
+  const auto first = reinterpret_cast<std::uintptr_t>(bytes);
+  const auto pixels = reinterpret_cast<std::uintptr_t>(image.GetDataPtr());
+  return pixels != 0 &&
+         (pixels < first ? first - pixels < image.GetImageSize() : pixels - first < size);
 }
 
 /// Brings the rows of a bitmap into an image that has been formatted for them.
