@@ -21,8 +21,8 @@ void SavePicture(const dImage& image, const std::filesystem::path& path);
 
 /// The same with the kind chosen by name rather than by extension.
 void SavePng(const dImage& image, const std::filesystem::path& path);
-/// BMP also takes images of 1 bit, and "BGRA". `ascending`: the colour table of grey images runs from
-/// black to white, else from white to black.
+/// BMP also takes images of 1 bit, and "BGRA". `ascending`: the colour table of grey images runs
+/// from black to white, else from white to black.
 void SaveBmp(const dImage& image, const std::filesystem::path& path, bool ascending = true);
 
 /// Reads a PNG of up to 8 bits per sample: grey, "BGR", or "BGRA" where something is transparent.

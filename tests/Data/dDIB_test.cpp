@@ -198,6 +198,18 @@ TEST(dDIB, BlockAndBitsMayBeItsOwn) {
   EXPECT_TRUE(ShowsItsSection(dib));
 }
 
+#if !defined(_WIN32)  // the system may have the memory
+TEST(dDIB, SectionThatTheDeviceRefusesTellsWhy) {
+  LogRecorder log;
+  dDIB dib(4, 4, 1, 8);
+  EXPECT_FALSE(dib.Init(40000, 20000, 4, 8));
+  EXPECT_EQ(StatusText(dib), "CreateDIBSection failed");
+  EXPECT_EQ(log.errors, std::vector<std::string>{"dDIB::Init: CreateDIBSection failed"});
+  EXPECT_FALSE(dib.IsValid());
+  EXPECT_EQ(dib.GetHandle(), nullptr);
+}
+#endif
+
 TEST(dDIB, BlockThatCannotBeReadTellsWhy) {
   const tagBITMAPINFO info{{40, 4, 4, 1, 5, 0, 0, 0, 0, 0, 0}, {}};
   const unsigned char bits[64] = {};

@@ -157,6 +157,8 @@ TEST(vIma2DeviceDrawing, DeviceThatIsNoneFails) {
   vIma2Device renderer;
   ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
   EXPECT_FALSE(renderer.Draw(nullptr));
+  renderer.EnableTransparency(0xFFFFFFUL);
+  EXPECT_FALSE(renderer.Draw(nullptr));
 }
 
 }  // namespace

@@ -40,6 +40,16 @@ TEST(vIma2Device, DrawsNothingAtFirst) {
   EXPECT_EQ(RectText(*renderer.GetTargetRect()), kNoRect);
 }
 
+TEST(vIma2Device, AskingWhetherThereIsAnImageClearsAnOldFailure) {
+  dImage image = NumberedImage(5, 3, 8, "BGR");
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
+  EXPECT_FALSE(renderer.EraseBackground(nullptr, nullptr, nullptr, 0));
+  EXPECT_EQ(StatusText(renderer), "EraseBackground: no region specified");
+  EXPECT_TRUE(renderer.IsInitialized());
+  EXPECT_TRUE(renderer.GetStatus() == 0);
+}
+
 TEST(vIma2Device, TakesTheWholeImageWithoutRectangles) {
   dImage image = NumberedImage(5, 3, 8, "BGR");
   vIma2Device renderer;

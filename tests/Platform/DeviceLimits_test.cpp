@@ -71,6 +71,7 @@ TEST(DeviceLimits, HeadersThatAreNoBitmapAreRefused) {
   const Case cases[] = {
       {"no size", [](BITMAPINFOHEADER& h) { h.biSize = 0; }},
       {"old header", [](BITMAPINFOHEADER& h) { h.biSize = 12; }},
+      {"header without end", [](BITMAPINFOHEADER& h) { h.biSize = 0x40000000; }},
       {"no width", [](BITMAPINFOHEADER& h) { h.biWidth = 0; }},
       {"negative width", [](BITMAPINFOHEADER& h) { h.biWidth = -4; }},
       {"lowest width", [](BITMAPINFOHEADER& h) { h.biWidth = kMin; }},

@@ -216,6 +216,8 @@ std::uint64_t dImaDescriptorDIB::FileRowBytes() const {
 // drawn must lie inside the pixels.
 bool dImaDescriptorDIB::IsCurrent() const {
   return !m_block.empty() && m_pixelData != nullptr && m_pImage->GetDataPtr() == m_pixelData &&
+         m_block.front().bmiHeader.biSize == kInfoHeaderSize &&
+         m_block.front().bmiHeader.biCompression == BI_RGB &&
          m_pImage->GetWidth() == m_imageWidth && m_pImage->GetHeight() == RowCount() &&
          m_pImage->GetColumnOffset() == m_block.front().bmiHeader.biBitCount &&
          m_pImage->GetBytesPerRow() == MemoryRowBytes() && FileRowBytes() <= MemoryRowBytes() &&

@@ -79,7 +79,8 @@ class VORL_API vIma2Device : public BaseClass {
   void EnableTransparency(int x, int y);
   void DisableTransparency();
 
-  /// Draws the image; false without one, and when the device refuses.
+  /// Draws the image; false without one ("not initialized"), and without a message when the device
+  /// refuses.
   bool Draw(HDC dc);
   /// Fills a region with a colour, except for a rectangle (null or empty: none). False without a
   /// region, and when the device refuses.
@@ -88,7 +89,8 @@ class VORL_API vIma2Device : public BaseClass {
   /// The same around the target rectangle, if `excludeImage` is set and there is an image.
   bool EraseBackground(HDC dc, const tagRECT* region, unsigned long colour, bool excludeImage);
 
-  /// How the last operation that can fail went.
+  /// How the last `Init`, `IsInitialized` or failed `EraseBackground` went; asking `IsInitialized`,
+  /// as drawing does, sets it anew.
   const dStatus& GetStatus() const;
 
  protected:

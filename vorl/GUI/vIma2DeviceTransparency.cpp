@@ -48,6 +48,7 @@ class MaskColours {
       : m_dc(dc), m_background(SetBkColor(dc, kWhite)), m_text(SetTextColor(dc, kBlack)) {}
   MaskColours(const MaskColours&) = delete;
   MaskColours& operator=(const MaskColours&) = delete;
+  bool AreSet() const { return m_background != CLR_INVALID; }
   ~MaskColours() {
     SetTextColor(m_dc, m_text);
     SetBkColor(m_dc, m_background);
@@ -128,6 +129,9 @@ bool vIma2Device::CreateMask(HDC dc) {
 
 bool vIma2Device::DrawTransparent(HDC dc) {
   const MaskColours colours(dc);
+  if (!colours.AreSet()) {
+    return false;  // no device: bitmaps made for none would be kept for those to come
+  }
   if ((m_imageBitmap == nullptr || m_maskBitmap == nullptr) && !CreateMask(dc)) {
     return false;
   }

@@ -194,15 +194,13 @@ TEST_F(opDIB2ImaRefusal, HeaderMustHaveAKnownSize) {
 }
 
 TEST_F(opDIB2ImaRefusal, MasksOfALongerHeaderMustBeThoseOfPlainPixels) {
-  for (const int bits : {16, 32}) {
-    Bitmap bitmap = Good();
-    bitmap.bits = bits;
-    bitmap.palette.clear();
-    bitmap.infoSize = 56;
-    bitmap.infoRest.assign(16, 0xF0);
-    bitmap.compression = 3;
-    EXPECT_EQ(RefusalOf(bitmap), "opDIB2Ima: unsupported compression: bit fields");
-  }
+  Bitmap bitmap = Good();
+  bitmap.bits = 32;
+  bitmap.palette.clear();
+  bitmap.infoSize = 56;
+  bitmap.infoRest.assign(16, 0xF0);
+  bitmap.compression = 3;
+  EXPECT_EQ(RefusalOf(bitmap), "opDIB2Ima: unsupported compression: bit fields");
 }
 
 TEST_F(opDIB2ImaRefusal, ThereMustBeOnePlane) {

@@ -32,8 +32,8 @@ class BitmapSource;
 /// file never more than stand before the pixels. An index without an entry is black.
 ///
 /// Bitmaps have a header of 40 bytes, or one of 52, 56, 108 or 124 that goes on behind the same
-/// fields, and are not compressed. 16-bit bitmaps with bit masks behind
-/// the short header are read like those without; else the masks must be those of plain pixels.
+/// fields, and are not compressed. 16-bit bitmaps with bit masks are read
+/// like those without; of 32-bit ones the masks must be those of plain pixels.
 ///
 /// *Errors.* `Convert` returns false, sets and logs the status, and leaves the image reset:
 /// - "no name for bitmap file specified", "no bitmap information block specified", "no pixel bits

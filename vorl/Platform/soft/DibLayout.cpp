@@ -12,6 +12,7 @@ namespace vorl_detail {
 namespace {
 
 constexpr std::uint64_t kMaximumBytes = 0x7FFFFFFF;
+constexpr DWORD kLargestHeader = 124;       // of those that have been published
 constexpr DWORD kHeaderSizeWithMasks = 52;  // longer headers hold the masks themselves
 
 bool IsKnownDepth(int depth) {
@@ -72,9 +73,10 @@ std::optional<DibLayout> ReadHeader(const BITMAPINFOHEADER& header) {
   const int depth = header.biBitCount;
   const bool hasMasks = header.biCompression == BI_BITFIELDS && (depth == 16 || depth == 32);
   SetError(ERROR_INVALID_PARAMETER);  // until all is well
-  if (header.biSize < sizeof header || header.biPlanes != 1 || !IsKnownDepth(depth) ||
-      (header.biCompression != BI_RGB && !hasMasks) || header.biWidth <= 0 ||
-      header.biHeight == 0 || header.biHeight == std::numeric_limits<LONG>::min()) {
+  if (header.biSize < sizeof header || header.biSize > kLargestHeader || header.biPlanes != 1 ||
+      !IsKnownDepth(depth) || (header.biCompression != BI_RGB && !hasMasks) ||
+      header.biWidth <= 0 || header.biHeight == 0 ||
+      header.biHeight == std::numeric_limits<LONG>::min()) {
     return std::nullopt;
   }
   DibLayout layout;

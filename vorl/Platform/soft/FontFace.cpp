@@ -239,6 +239,12 @@ std::shared_ptr<FontFace> FontFace::Open(const LOGFONTA& description) {
     font->m_face = nullptr;
     return font;
   }
+  // Where no scalable font is installed, the nearest one may be a set of bitmaps.
+  if (!FT_IS_SCALABLE(font->m_face) || font->m_face->units_per_EM == 0) {
+    FT_Done_Face(font->m_face);
+    font->m_face = nullptr;
+    return font;
+  }
   const bool isBold = IntegerOf(match.get(), FC_WEIGHT, FC_WEIGHT_REGULAR) >= FC_WEIGHT_DEMIBOLD;
   font->m_isEmboldened = WeightOf(description) >= FW_SEMIBOLD && !isBold;
   font->m_isSlanted = description.lfItalic != 0 &&

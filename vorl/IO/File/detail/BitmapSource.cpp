@@ -57,12 +57,9 @@ bool BitmapSource::HasKnownHeader() const {
 }
 
 bool BitmapSource::HasPlainMasks() const {
-  using Masks = std::array<DWORD, 3>;
-  if (header.biBitCount == 16) {
-    // Behind the short header they are not looked at: such a bitmap is always read as 5-5-5.
-    return header.biSize == kInfoHeaderSize || masks == Masks{0x7C00, 0x3E0, 0x1F};
-  }
-  return header.biBitCount == 32 && masks == Masks{0xFF0000, 0xFF00, 0xFF};
+  constexpr std::array<DWORD, 3> kPlain{0xFF0000, 0xFF00, 0xFF};
+  // Those of 16 bits are not looked at: such a bitmap is always read as five bits per colour.
+  return header.biBitCount == 16 || (header.biBitCount == 32 && masks == kPlain);
 }
 
 std::size_t BitmapSource::BytesBeforePalette() const {
