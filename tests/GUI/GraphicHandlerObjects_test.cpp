@@ -204,9 +204,11 @@ TEST_F(GraphicHandlerDeleteObjects, ObjectWithoutTypeIsOfEveryType) {
   EXPECT_FALSE(layer.handler.DeleteObjects(VGType_Curve, 6));
 }
 
-TEST_F(GraphicHandlerDeleteObjects, NoTypeNamesOnlyObjectsWithoutOne) {
+TEST_F(GraphicHandlerDeleteObjects, NoTypeMeansAnyType) {
+  EXPECT_TRUE(layer.handler.DeleteObjects(VGType_None, 5));
+  EXPECT_EQ(Rest(layer.handler), "24");
   EXPECT_TRUE(layer.handler.DeleteObjects(VGType_None, -1));
-  EXPECT_EQ(Rest(layer.handler), "123");
+  EXPECT_EQ(Rest(layer.handler), "");
 }
 
 TEST_F(GraphicHandlerDeleteObjects, UnknownIdDeletesNothing) {
