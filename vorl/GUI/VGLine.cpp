@@ -6,10 +6,10 @@
 
 inline namespace vorl {
 
+using vorl_detail::Enlarged;
 using vorl_detail::HandleWidth;
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
-using vorl_detail::ToDevice;
 
 VGLine::VGLine() = default;
 
@@ -176,9 +176,7 @@ void VGLineView::DrawGraphic(HDC dc) {
       // A little more than can be seen, so that the ends of a wide line stay outside.
       tagRECT clip{};
       GetClipBox(dc, &clip);
-      clip = {ToDevice(std::int64_t{clip.left} - 2), ToDevice(std::int64_t{clip.top} - 2),
-              ToDevice(std::int64_t{clip.right} + 2), ToDevice(std::int64_t{clip.bottom} + 2)};
-      isSeen = Geom2D::ClipLine(m_viewPos, ViewEnd(), clip, start, end);
+      isSeen = Geom2D::ClipLine(m_viewPos, ViewEnd(), Enlarged(clip, 2), start, end);
     }
     if (isSeen) {
       pen.Line(start, end);

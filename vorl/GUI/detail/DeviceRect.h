@@ -34,6 +34,13 @@ inline int HeightOf(const tagRECT& rect) {
   return ExtentOf(rect.top, rect.bottom);
 }
 
+/// The rectangle with all four edges moved outwards.
+inline tagRECT Enlarged(const tagRECT& rect, int margin) {
+  return {ToDevice(std::int64_t{rect.left} - margin), ToDevice(std::int64_t{rect.top} - margin),
+          ToDevice(std::int64_t{rect.right} + margin),
+          ToDevice(std::int64_t{rect.bottom} + margin)};
+}
+
 }  // namespace vorl_detail
 }  // namespace vorl
 

@@ -33,12 +33,14 @@ class ShapeROP {
   int m_old;
 };
 
-/// A pen of a shape's style and colour in a device context.
+/// A pen of a shape's style in a device context, in the shape's colour where no other is given.
 class ShapePen {
  public:
   ShapePen(HDC dc, const VGObjectView& view, int width)
+      : ShapePen(dc, view, width, static_cast<COLORREF>(view.GetPenColor())) {}
+  ShapePen(HDC dc, const VGObjectView& view, int width, COLORREF color)
       : m_dc(dc),
-        m_pen(CreatePen(view.GetPenStyle(), width, static_cast<COLORREF>(view.GetPenColor()))),
+        m_pen(CreatePen(view.GetPenStyle(), width, color)),
         m_old(SelectObject(dc, m_pen)) {}
   ShapePen(const ShapePen&) = delete;
   ShapePen& operator=(const ShapePen&) = delete;
