@@ -3,27 +3,20 @@
 #include <vorl/Data/dRect.h>
 #include <vorl/GUI/Geom2D.h>
 #include <vorl/GUI/InputEventHandler.h>
+#include <vorl/GUI/detail/RectHandles.h>
 #include <vorl/GUI/detail/ShapePen.h>
 
 inline namespace vorl {
 
-using vorl_detail::HeightOf;
+using vorl_detail::DrawRectHandles;
+using vorl_detail::EdgesAt;
+using vorl_detail::PullEdges;
+using vorl_detail::RectEdge_Bottom;
+using vorl_detail::RectEdge_None;
+using vorl_detail::RectEdge_Right;
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
-using vorl_detail::Truncated;
-using vorl_detail::WidthOf;
-
-namespace {
-
-// The handles are as large on a thick outline as on a thin one.
-constexpr int kHandleWidth = 5;
-
-tagRECT DeviceRectOf(const VGRect& rect) {
-  return {Truncated<int>(rect.TopLeft().x), Truncated<int>(rect.TopLeft().y),
-          Truncated<int>(rect.BottomRight().x), Truncated<int>(rect.BottomRight().y)};
-}
-
-}  // namespace
+using vorl_detail::TruncatedRect;
 
 VGRect::VGRect() = default;
 
@@ -101,8 +94,7 @@ VGRectView& VGRectView::operator=(const VGRectView& source) {
   if (this != &source) {
     VGObjectView::operator=(source);
     m_reference = source.m_reference;
-    m_edgeX = source.m_edgeX;
-    m_edgeY = source.m_edgeY;
+    m_edges = source.m_edges;
     SetData(source);
   }
   return *this;
@@ -136,52 +128,19 @@ bool VGRectView::IsPointOnGraphic(dVect2D& point, int tolerance) {
 }
 
 short VGRectView::GetSelectionState(int /*flags*/, dVect2D& point) {
-  m_edgeX = EdgeX::None;
-  m_edgeY = EdgeY::None;
+  m_edges = RectEdge_None;
   if (!IsVisible() || !IsEnabled(VGOperation_Select)) {
     return VGOperation_None;
   }
-  if (GrabHandle(point)) {
+  m_edges = EdgesAt(point, m_view.TopLeft(), m_view.BottomRight(), GetHandleDistance());
+  if (m_edges != RectEdge_None) {
     return VGOperation_Modify;
   }
   return IsPointOnGraphic(point, GetLineDistance()) ? VGOperation_Move : VGOperation_None;
 }
 
-// Where handles lie close together, the first of them wins.
-bool VGRectView::GrabHandle(const dVect2D& point) {
-  const double left = m_view.TopLeft().x;
-  const double top = m_view.TopLeft().y;
-  const double right = m_view.BottomRight().x;
-  const double bottom = m_view.BottomRight().y;
-  const double width = right - left;
-  const double height = bottom - top;
-  const struct {
-    double x;
-    double y;
-    EdgeX edgeX;
-    EdgeY edgeY;
-  } handles[] = {{left, top, EdgeX::Left, EdgeY::Top},
-                 {left + width * 0.5, top, EdgeX::None, EdgeY::Top},
-                 {left + width, top, EdgeX::Right, EdgeY::Top},
-                 {right, top + height * 0.5, EdgeX::Right, EdgeY::None},
-                 {right, top + height, EdgeX::Right, EdgeY::Bottom},
-                 {right - width * 0.5, bottom, EdgeX::None, EdgeY::Bottom},
-                 {left, bottom, EdgeX::Left, EdgeY::Bottom},
-                 {left, bottom - height * 0.5, EdgeX::Left, EdgeY::None}};
-  for (const auto& handle : handles) {
-    dVect2D pos;
-    pos.Set(handle.x, handle.y);
-    if (Geom2D::IsPointOnPoint(point, pos, GetHandleDistance())) {
-      m_edgeX = handle.edgeX;
-      m_edgeY = handle.edgeY;
-      return true;
-    }
-  }
-  return false;
-}
-
 void VGRectView::DrawGraphic(HDC dc) {
-  const tagRECT rect = DeviceRectOf(m_view);
+  const tagRECT rect = TruncatedRect(m_view.TopLeft(), m_view.BottomRight());
   const ShapePen pen(dc, *this, GetPenThickness());
   const ShapeROP rop(dc, *this);
   MoveToEx(dc, rect.left, rect.top, nullptr);
@@ -192,20 +151,7 @@ void VGRectView::DrawGraphic(HDC dc) {
 }
 
 void VGRectView::DrawSelection(HDC dc) {
-  const tagRECT rect = DeviceRectOf(m_view);
-  const int halfWidth = WidthOf(rect) / 2;
-  const int halfHeight = HeightOf(rect) / 2;
-  const ShapePen pen(dc, *this, kHandleWidth);
-  const ShapeROP rop(dc, *this);
-  pen.Dot(rect.left, rect.top);
-  pen.Dot(rect.left + halfWidth, rect.top);
-  pen.Dot(rect.right, rect.top);
-  pen.Dot(rect.right, rect.top + halfHeight);
-  pen.Dot(rect.right, rect.bottom);
-  // The middles of these two edges count from the far corner.
-  pen.Dot(rect.right - halfWidth, rect.bottom);
-  pen.Dot(rect.left, rect.bottom);
-  pen.Dot(rect.left, rect.bottom - halfHeight);
+  DrawRectHandles(dc, *this, TruncatedRect(m_view.TopLeft(), m_view.BottomRight()));
 }
 
 void VGRectView::CalcBoundingBox(HDC /*dc*/, dVect2D& min, dVect2D& max) {
@@ -228,8 +174,7 @@ bool VGRectView::OnCreate(int event, int /*flags*/, dVect2D& point) {
   SetOpState(VGOperation_Modify);
   AssignViewState(VGViewState_Visible | VGViewState_Selected);
   m_view.Init(point.x, point.y, point.x + 1.0F, point.y + 1.0F);
-  m_edgeX = EdgeX::Right;
-  m_edgeY = EdgeY::Bottom;
+  m_edges = RectEdge_Right | RectEdge_Bottom;
   ViewDataChanged();
   return OnBeginModify(point);
 }
@@ -258,19 +203,13 @@ bool VGRectView::OnBeginModify(dVect2D& /*point*/) {
 }
 
 bool VGRectView::OnModify(dVect2D& point) {
-  if (m_edgeX != EdgeX::None) {
-    (m_edgeX == EdgeX::Left ? m_view.TopLeft() : m_view.BottomRight()).x = point.x;
-  }
-  if (m_edgeY != EdgeY::None) {
-    (m_edgeY == EdgeY::Top ? m_view.TopLeft() : m_view.BottomRight()).y = point.y;
-  }
+  PullEdges(m_edges, point, m_view.TopLeft(), m_view.BottomRight());
   ViewDataChanged();
   return true;
 }
 
 bool VGRectView::OnEndModify(dVect2D& /*point*/) {
-  m_edgeX = EdgeX::None;
-  m_edgeY = EdgeY::None;
+  m_edges = RectEdge_None;
   return EndOperation();
 }
 

@@ -7,6 +7,8 @@
 #include <vorl/GUI/VGObjectView.h>
 #include <vorl/Platform/GdiFwd.h>
 
+#include <cstdint>
+
 inline namespace vorl {
 
 /// Two corners, in graphic coordinates. Their order is kept: the top left one may lie below or
@@ -91,16 +93,11 @@ class VORL_API VGRectView : public VGRect, public VGObjectView {
   void GetViewData(VGRect& rect) const;
 
  private:
-  enum class EdgeX { None, Left, Right };
-  enum class EdgeY { None, Top, Bottom };
-
-  bool GrabHandle(const dVect2D& point);
   bool EndOperation();
 
   VGRect m_view;
-  dVect2D m_reference;  ///< where the last event of a move was
-  EdgeX m_edgeX = EdgeX::None;
-  EdgeY m_edgeY = EdgeY::None;
+  dVect2D m_reference;       ///< where the last event of a move was
+  std::uint8_t m_edges = 0;  ///< which a modification pulls
 };
 
 }  // namespace vorl
