@@ -37,6 +37,7 @@
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/VGBitmapView.h>
 #include <vorl/GUI/VGCrossCursorView.h>
 #include <vorl/GUI/VGLine.h>
 #include <vorl/GUI/VGObjectView.h>
