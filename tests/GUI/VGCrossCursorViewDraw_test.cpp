@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
+
 #include "ShapeTesting.h"
 
 namespace {
@@ -196,13 +198,29 @@ TEST(VGCrossCursorViewDraw, ShortDirectionsAreNotLost) {
   EXPECT_EQ(canvas.At(30, 2), 0x0000FFu);
 }
 
-TEST(VGCrossCursorViewDraw, DegenerateNumbersDoNoHarm) {
+// Deep in a zoomed picture the cursor may be far outside of what is seen.
+TEST(VGCrossCursorViewDraw, FarPositionsKeepTheSlope) {
   const BlackCanvas canvas;
+  ColourCursor cursor(16 - 3e6F, 16 - 1e6F, 1);
+  cursor.SetCursorOrientation(1, dVect2D(0.3F, 0.1F));
+  cursor.DrawGraphic(canvas);
+  EXPECT_TRUE(canvas.At(16, 15) != 0 || canvas.At(16, 16) != 0 || canvas.At(16, 17) != 0);
+  EXPECT_EQ(Lit(canvas).size(), unsigned{kSize});
+}
+
+TEST(VGCrossCursorViewDraw, DegenerateNumbersDoNoHarm) {
+  BlackCanvas canvas;
   ColourCursor cursor(1e30F, -1e30F, 3);
   cursor.SetCursorOrientation(dVect2D(0, 0), dVect2D(1e38F, 1e38F));
   cursor.DrawGraphic(canvas);
+  cursor.SetCursorOrientation(2, dVect2D(1, 2));
+  cursor.Set(HUGE_VAL, std::nan(""));
+  cursor.DrawGraphic(canvas);
+  cursor.SetCursorOrientation(1, dVect2D(0, 0));
   cursor.Set(16.0, 16.0);
   cursor.SetCursorMode(1);
+  cursor.DrawGraphic(canvas);
+  canvas.Fill(0);
   cursor.DrawGraphic(canvas);
   EXPECT_EQ(Lit(canvas), Pixels{}) << "no direction, no line";
 }

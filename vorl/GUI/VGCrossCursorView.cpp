@@ -1,5 +1,6 @@
 #include <vorl/GUI/VGCrossCursorView.h>
 
+#include <algorithm>
 #include <cmath>
 
 #include <vorl/GUI/Geom2D.h>
@@ -15,11 +16,14 @@ using vorl_detail::ShapeROP;
 
 namespace {
 
-// Another point of a line, some thousand pixels away: one close by would lose the direction when
-// it is rounded to single precision. A power of two keeps the ratio of the components exactly.
+// Another point of a line, at least as far away as a screen is wide and as the origin is: one close
+// by would lose the direction when it is rounded to single precision. A power of two keeps the
+// ratio of the components exactly.
 dVect2D FarPoint(const dVect2D& pos, const dVect2D& direction) {
   const double length = direction.Length();
-  const int exponent = std::isnormal(length) ? 11 - std::ilogb(length) : 0;
+  const double reach = std::max({2048.0, std::fabs(double{pos.x}), std::fabs(double{pos.y})});
+  const bool isRegular = std::isnormal(length) && std::isfinite(reach);
+  const int exponent = isRegular ? std::ilogb(reach) - std::ilogb(length) : 0;
   dVect2D point;
   point.Set(pos.x + std::ldexp(double{direction.x}, exponent),
             pos.y + std::ldexp(double{direction.y}, exponent));
