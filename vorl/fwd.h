@@ -83,6 +83,8 @@ class VGPoint;
 class VGPointView;
 class VGRect;
 class VGRectView;
+class VGText;
+class VGTextView;
 class vIma2Device;
 
 }  // namespace vorl

@@ -41,6 +41,7 @@
 #include <vorl/GUI/VGObjectView.h>
 #include <vorl/GUI/VGPoint.h>
 #include <vorl/GUI/VGRect.h>
+#include <vorl/GUI/VGText.h>
 #include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/IO/File/opDIB2Ima.h>
