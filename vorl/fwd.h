@@ -75,6 +75,8 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGAxis;
+class VGAxisView;
 class VGCurve;
 class VGCurveView;
 class VGLine;

@@ -37,6 +37,7 @@
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/VGAxis.h>
 #include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGLine.h>
 #include <vorl/GUI/VGObjectView.h>
