@@ -75,8 +75,12 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGAxis;
+class VGAxisView;
 class VGBitmapView;
 class VGCrossCursorView;
+class VGCurve;
+class VGCurveView;
 class VGLine;
 class VGLineView;
 class VGObject;
@@ -85,6 +89,8 @@ class VGPoint;
 class VGPointView;
 class VGRect;
 class VGRectView;
+class VGText;
+class VGTextView;
 class vIma2Device;
 
 }  // namespace vorl

@@ -37,12 +37,15 @@
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/VGAxis.h>
 #include <vorl/GUI/VGBitmapView.h>
 #include <vorl/GUI/VGCrossCursorView.h>
+#include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGLine.h>
 #include <vorl/GUI/VGObjectView.h>
 #include <vorl/GUI/VGPoint.h>
 #include <vorl/GUI/VGRect.h>
+#include <vorl/GUI/VGText.h>
 #include <vorl/GUI/vIma2Device.h>
 #include <vorl/IO/BinaryDataIO.h>
 #include <vorl/IO/File/opDIB2Ima.h>

@@ -1,22 +1,11 @@
-#include <new>
 #include <utility>
 
 #include <vorl/GUI/Trafo1D.h>
+#include <vorl/GUI/detail/OwnedText.h>
 
 inline namespace vorl {
 
-namespace {
-
-// A text that finds no memory is dropped: the numbers are what matters.
-std::string TextOf(const char* text) noexcept {
-  try {
-    return text != nullptr ? text : "";
-  } catch (const std::bad_alloc&) {
-    return {};
-  }
-}
-
-}  // namespace
+using vorl_detail::TextOf;
 
 UnitTrafo::UnitTrafo() = default;
 
