@@ -2,7 +2,9 @@
 #include <gtest/gtest.h>
 #include <tests/Support/Allocation.h>
 #include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGPoint.h>
+#include <vorl/GUI/VGText.h>
 
 namespace {
 
@@ -71,6 +73,41 @@ TEST(GraphicsOutOfMemory, CreatedObjectThatCannotBeListedIsDestroyed) {
   }
   EXPECT_EQ(CountedPoint::living, 0);
   EXPECT_EQ(handler.GetActiveObject(), nullptr);
+}
+
+TEST(GraphicsOutOfMemory, TextIsEmpty) {
+  const char* const words = "a text that is too long to be kept without any memory of its own";
+  VGText text;
+  text.SetPos(3.0F, 4.0F, 5);
+  text = words;
+  VGText assigned;
+  {
+    const AllocationFailure failure;
+    const VGText copy(text);
+    EXPECT_STREQ(copy.GetText(), "");
+    EXPECT_EQ(copy.GetPos().x, 3.0F);
+    EXPECT_EQ(copy.GetAlignment(), 5);
+    assigned = text;
+    text = words;
+  }
+  EXPECT_STREQ(assigned.GetText(), "");
+  EXPECT_EQ(assigned.GetPos().y, 4.0F);
+  EXPECT_STREQ(text.GetText(), "");
+}
+
+TEST(GraphicsOutOfMemory, CurveIsEmpty) {
+  float values[] = {1, 2, 3};
+  VGCurve curve;
+  ASSERT_TRUE(curve.SetData(1, 1, 3, values, CurveStorageMode_Copy));
+  {
+    const AllocationFailure failure;
+    const VGCurve copy(curve);
+    EXPECT_EQ(copy.GetSize(), 0);
+    EXPECT_FALSE(curve.SetData(1, 1, 3, values, CurveStorageMode_Copy));
+  }
+  EXPECT_EQ(curve.GetSize(), 0);
+  EXPECT_EQ(curve.GetData(), nullptr);
+  EXPECT_EQ(curve.GetDeltaX(), 0.0F);
 }
 
 }  // namespace
