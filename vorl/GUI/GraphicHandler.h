@@ -114,8 +114,8 @@ class VORL_API GraphicHandler : public InputEventHandler {
   /// Deletes this object. False for null and with an empty list, else true: also for an object that
   /// is not in the list, which is left alone.
   virtual bool DeleteObject(VGObjectView* object);
-  /// Deletes the objects of a type with an ID: `VGType_None` means any type, -1 any ID. An object of
-  /// `VGType_None` counts as one of every type. False when there were none.
+  /// Deletes the objects of a type with an ID: `VGType_None` means any type, -1 any ID. An object
+  /// of `VGType_None` counts as one of every type. False when there were none.
   virtual bool DeleteObjects(VGType type, long id);
   /// Deletes all objects; true.
   virtual bool DeleteAll();
@@ -212,9 +212,9 @@ class VORL_API GraphicHandler : public InputEventHandler {
   UnitTrafo m_unitTrafoX;
   UnitTrafo m_unitTrafoY;
   IGraphicHandler* m_pInterface = nullptr;
-  std::size_t m_walks = 0;      ///< walks through the list that are under way
-  bool m_mayRepeat = false;     ///< some object was listed more than once
-  Doomed* m_pDoomed = nullptr;  ///< the objects that are just being destroyed
+  std::size_t m_walks = 0;              ///< walks through the list that are under way
+  bool m_mayRepeat = false;             ///< some object was listed more than once
+  std::vector<VGObjectView*> m_doomed;  ///< those that are just being destroyed, by this handler
 };
 
 }  // namespace vorl

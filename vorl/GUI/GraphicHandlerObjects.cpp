@@ -36,25 +36,24 @@ class GraphicHandler::Walk {
   std::size_t m_end;
 };
 
-/// An object that is about to be destroyed, as long as nobody else has done it.
+/// An object that is about to be destroyed, as long as nobody else has done it. There is room for
+/// it: `Append` has seen to that.
 class GraphicHandler::Doomed {
  public:
   Doomed(GraphicHandler& handler, VGObjectView* object)
-      : m_handler(handler), m_outer(handler.m_pDoomed), m_object(object) {
-    handler.m_pDoomed = this;
+      : m_list(handler.m_doomed), m_index(handler.m_doomed.size()) {
+    m_list.push_back(object);
   }
   Doomed(const Doomed&) = delete;
   Doomed& operator=(const Doomed&) = delete;
-  ~Doomed() { m_handler.m_pDoomed = m_outer; }
+  ~Doomed() { m_list.pop_back(); }
 
-  Doomed* Outer() const { return m_outer; }
-  VGObjectView* Object() const { return m_object; }
-  void Reset() { m_object = nullptr; }
+  /// Null when it is gone.
+  VGObjectView* Object() const { return m_list[m_index]; }
 
  private:
-  GraphicHandler& m_handler;
-  Doomed* m_outer;
-  VGObjectView* m_object;
+  std::vector<VGObjectView*>& m_list;
+  std::size_t m_index;
 };
 
 GraphicHandler::GraphicHandler() = default;
@@ -132,11 +131,7 @@ bool GraphicHandler::Owns(const VGObjectView* object) const {
 }
 
 bool GraphicHandler::IsDoomed(const VGObjectView* object) const {
-  const Doomed* doomed = m_pDoomed;
-  while (doomed != nullptr && doomed->Object() != object) {
-    doomed = doomed->Outer();
-  }
-  return doomed != nullptr;
+  return std::find(m_doomed.begin(), m_doomed.end(), object) != m_doomed.end();
 }
 
 bool GraphicHandler::IsRegistered(const VGObjectView* object) const {
@@ -171,11 +166,7 @@ void GraphicHandler::Forget(VGObjectView* object) {
   if (m_pActive == object) {
     m_pActive = nullptr;
   }
-  for (Doomed* doomed = m_pDoomed; doomed != nullptr; doomed = doomed->Outer()) {
-    if (doomed->Object() == object) {
-      doomed->Reset();
-    }
-  }
+  std::replace(m_doomed.begin(), m_doomed.end(), object, static_cast<VGObjectView*>(nullptr));
 }
 
 bool GraphicHandler::Append(VGObjectView* object, bool isBorrowed) {
@@ -184,6 +175,9 @@ bool GraphicHandler::Append(VGObjectView* object, bool isBorrowed) {
     return false;
   }
   try {
+    if (m_doomed.capacity() <= m_list.size()) {
+      m_doomed.reserve(2 * m_list.size() + 8);  // all may be destroyed, one within the other
+    }
     m_list.push_back({object, isBorrowed});
   } catch (const std::bad_alloc&) {
     if (!isRepeated && m_pActive != object) {
