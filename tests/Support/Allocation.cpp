@@ -29,7 +29,6 @@ AllocationDelay::~AllocationDelay() {
   delay = 0;
 }
 
-// The array and non-throwing forms of the standard library come here as well.
 void* operator new(std::size_t size) {
   if (delay > 0) {
     std::this_thread::sleep_for(std::chrono::milliseconds(delay));
@@ -39,6 +38,31 @@ void* operator new(std::size_t size) {
     throw std::bad_alloc();
   }
   return memory;
+}
+
+// Where the standard library is a DLL, its other forms do not come to the one above.
+void* operator new[](std::size_t size) {
+  return operator new(size);
+}
+
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept {
+  try {
+    return operator new(size);
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
+}
+
+void* operator new[](std::size_t size, const std::nothrow_t& tag) noexcept {
+  return operator new(size, tag);
+}
+
+void operator delete[](void* memory) noexcept {
+  operator delete(memory);
+}
+
+void operator delete[](void* memory, std::size_t) noexcept {
+  operator delete(memory);
 }
 
 void operator delete(void* memory) noexcept {
