@@ -69,6 +69,66 @@ TEST(dDIBTransfer, AssignedImageMayReferToItsOwnSection) {
   }
 }
 
+// A name for each way in which a bitmap takes an image as if it were a plain one.
+struct WayThroughBase {
+  const char* name;
+  void (*take)(dImage& bitmap, dImage& image);
+  bool resetsImage;
+};
+
+constexpr WayThroughBase kWaysThroughBase[] = {
+    {"=", [](dImage& bitmap, dImage& image) { bitmap = image; }, false},
+    {"<<=", [](dImage& bitmap, dImage& image) { bitmap <<= image; }, true},
+    {">>=", [](dImage& bitmap, dImage& image) { image >>= bitmap; }, true},
+};
+
+TEST(dDIBTransfer, PlainImageTakenThroughTheBaseClassGetsASection) {
+  for (const WayThroughBase& way : kWaysThroughBase) {
+    dImage image = PlainImage(1);
+    const dImage expected(image);
+    dDIB dib(5, 3, 3, 8);
+    way.take(dib, image);
+    EXPECT_TRUE(SamePixels(dib, expected)) << way.name;
+    EXPECT_TRUE(ShowsItsSection(dib)) << way.name;
+    EXPECT_EQ(image.IsValid(), !way.resetsImage) << way.name;
+  }
+}
+
+TEST(dDIBTransfer, ImageThatRefersToTheSectionCanBeTakenThroughTheBaseClass) {
+  for (const WayThroughBase& way : kWaysThroughBase) {
+    for (const bool partly : {false, true}) {
+      dDIB dib(5, 3, 3, 8);
+      FillWithCount(dib);
+      dImage part;
+      ASSERT_TRUE(part.Init(DTM_Reference, dib));
+      if (partly) {
+        ASSERT_TRUE(part.Init(5, 2, ImageDataType_U8, "BGR", ImageDataOrder_Pixel, 4));
+        part.GetDataBuffer().Init(dib.GetRowPtr(1), part.GetImageSize(), DTM_Reference);
+      }
+      const dImage expected(part);
+      way.take(dib, part);
+      EXPECT_TRUE(SamePixels(dib, expected)) << way.name << partly;
+      EXPECT_TRUE(ShowsItsSection(dib)) << way.name << partly;
+      EXPECT_EQ(part.IsValid(), !way.resetsImage) << way.name << partly;
+    }
+  }
+}
+
+TEST(dDIBTransfer, BitmapTakenThroughTheBaseClassMovesItsSection) {
+  for (const WayThroughBase& way : kWaysThroughBase) {
+    dDIB source(5, 3, 3, 8);
+    FillWithCount(source);
+    const dImage expected(source);
+    const HBITMAP handle = source.GetHandle();
+    dDIB dib(2, 2, 1, 8);
+    way.take(dib, source);
+    EXPECT_TRUE(SamePixels(dib, expected)) << way.name;
+    EXPECT_TRUE(ShowsItsSection(dib)) << way.name;
+    EXPECT_EQ(dib.GetHandle() == handle, way.resetsImage) << way.name;
+    EXPECT_EQ(source.GetHandle() == nullptr, way.resetsImage) << way.name;
+  }
+}
+
 TEST(dDIBTransfer, ImageThatIsNoBitmapIsRefusedAndStays) {
   dImage image = PlainImage(4, ImageDataType_U16, "G");
   for (const DataTransferMode mode : {DTM_Copy, DTM_TakeOver, DTM_Reference}) {

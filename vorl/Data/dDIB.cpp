@@ -1,6 +1,5 @@
 #include <vorl/Data/dDIB.h>
 
-#include <functional>
 #include <new>
 
 #include <vorl/Common/LogContext.h>
@@ -200,20 +199,11 @@ bool dDIB::Init(const tagBITMAPINFO* info, const void* bits) {
   return true;
 }
 
-// True when the image shows pixels of the section that this bitmap would delete.
-bool dDIB::SharesSection(const dImage& image) const {
-  const std::less<const void*> before;
-  const void* const pixels = image.GetDataPtr();
-  const auto* const first = static_cast<const unsigned char*>(GetDataPtr());
-  return m_ownsHandle && pixels != nullptr && !before(pixels, first) &&
-         before(pixels, first + GetImageSize());
-}
-
 bool dDIB::Init(DataTransferMode mode, dImage& source) {
   if (this == &source) {
     return true;
   }
-  if (SharesSection(source)) {
+  if (LendsTo(source)) {
     dImage copy(source);
     if (!TakeImage(DTM_Copy, copy)) {
       return false;
@@ -272,11 +262,7 @@ dDIB& dDIB::operator=(const dDIB& source) {
 }
 
 dDIB& dDIB::operator=(const dImage& source) {
-  if (this != &source && SharesSection(source)) {
-    dImage::operator=(dImage(source));
-  } else {
-    dImage::operator=(source);
-  }
+  dImage::operator=(source);
   return *this;
 }
 
@@ -285,11 +271,7 @@ void dDIB::operator<<=(dImage& source) {
 }
 
 void dDIB::operator>>=(dImage& destination) {
-  if (auto* const bitmap = dynamic_cast<dDIB*>(&destination)) {
-    *bitmap <<= *this;
-  } else {
-    destination <<= *this;
-  }
+  destination <<= *this;
 }
 
 }  // namespace vorl

@@ -120,7 +120,6 @@ class VORL_API dDIB : public dImage {
   bool TakeImage(DataTransferMode mode, dImage& source);
   bool TakeSection(DataTransferMode mode, dDIB& source);
   bool CreateSection(LogContext& context, unsigned long size);
-  bool SharesSection(const dImage& image) const;
   bool DrawBits(const dDIB& source, int x, int y, DWORD rasterOperation) const;
   bool Fail(LogContext& context, int line);
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <functional>
 #include <new>
 
 #include <vorl/Common/LogContext.h>
@@ -189,6 +190,14 @@ bool dImage::TakePixels(dImage& source, DataTransferMode mode) {
   return true;
 }
 
+bool dImage::LendsTo(const dImage& image) const {
+  const std::less<const void*> before;
+  const void* const pixels = image.GetDataPtr();
+  const auto* const first = static_cast<const unsigned char*>(GetDataPtr());
+  return m_lendsPixels && pixels != nullptr && !before(pixels, first) &&
+         before(pixels, first + GetImageSize());
+}
+
 bool dImage::Init(DataTransferMode mode, dImage& source) {
   LogContext context("dImage::Init", __FILE__, __LINE__, true);
   if (this == &source) {
@@ -211,6 +220,14 @@ dImage& dImage::operator=(const dImage& source) {
   if (this == &source) {
     return *this;
   }
+  if (LendsTo(source)) {
+    const dImage copy(source);
+    *this = copy;
+    if (!copy.IsValid()) {
+      m_status = copy.m_status;
+    }
+    return *this;
+  }
   dBuffer oldPixels;  // kept until the end where the source may refer to a part of them
   if (source.m_buffer.IsReference() && source.GetImageSize() != GetImageSize()) {
     oldPixels <<= m_buffer;
@@ -229,14 +246,7 @@ dImage& dImage::operator=(const dImage& source) {
 }
 
 void dImage::operator<<=(dImage& source) {
-  if (this == &source) {
-    return;
-  }
-  if (!ResetTo(source) || !TakePixels(source, DTM_TakeOver)) {
-    return;
-  }
-  OnInit();
-  source.Reset();
+  Init(DTM_TakeOver, source);
 }
 
 void dImage::operator>>=(dImage& destination) {

@@ -135,8 +135,8 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// image. Pixels of the same byte size are overwritten in place, which for an image that refers
   /// to pixels means those it refers to. `source` may refer to this image's pixels.
   dImage& operator=(const dImage& source);
-  /// Moves `source` into this image; the source is reset. When there is no memory for the names of
-  /// the channels, the source stays and this image is reset.
+  /// Moves `source` into this image, as `Init(DTM_TakeOver, source)` of this image's own class
+  /// does.
   void operator<<=(dImage& source);
   /// Moves this image into `destination`; this image is reset.
   void operator>>=(dImage& destination);
@@ -234,6 +234,8 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   void* AllocateDataBuffer(unsigned long size);
   /// Copies the pixels of an image of the same format, whose rows may be of another length.
   void CopyRows(const dImage& source);
+  /// True when the image shows pixels of this one that end with its `Reset`.
+  bool LendsTo(const dImage& image) const;
 
   dStatus m_status;
   dBuffer m_buffer;
