@@ -1,44 +1,15 @@
 // Drawing images and the device operations that drawing consists of, onto a screen of 3840 x 2160
 // pixels.
-#include <vorl/Data/dDIB.h>
 #include <vorl/GUI/vIma2Device.h>
 
-#include "../Fixtures.h"
+#include "../Screen.h"
 
 namespace {
 
 constexpr unsigned long kScreenWidth = 3840;
 constexpr unsigned long kScreenHeight = 2160;
 
-/// A bitmap of 32 bits, selected into a context.
-class Screen {
- public:
-  Screen()
-      : m_dib(static_cast<long>(bench::Shrunk(kScreenWidth)),
-              static_cast<long>(bench::Shrunk(kScreenHeight)), 4, 8),
-        m_dc(CreateCompatibleDC(nullptr)),
-        m_old(SelectObject(m_dc, m_dib.GetHandle())) {}
-  Screen(const Screen&) = delete;
-  Screen& operator=(const Screen&) = delete;
-  ~Screen() {
-    SelectObject(m_dc, m_old);
-    DeleteDC(m_dc);
-  }
-  operator HDC() const { return m_dc; }
-
-  int Width() const { return static_cast<int>(m_dib.GetWidth()); }
-  int Height() const { return static_cast<int>(m_dib.GetHeight()); }
-  tagRECT Rect() const { return {0, 0, Width(), Height()}; }
-  /// Each iteration wrote every pixel.
-  void Report(benchmark::State& state) const {
-    bench::Report(state, m_dib.GetWidth() * m_dib.GetHeight(), m_dib.GetImageSize());
-  }
-
- private:
-  dDIB m_dib;
-  HDC m_dc;
-  HGDIOBJ m_old;
-};
+using bench::Screen;
 
 template <class Draw>
 void Run(benchmark::State& state, const Screen& screen, Draw draw) {
@@ -58,7 +29,7 @@ void DrawImage(benchmark::State& state, const char* sequence, bool transparent) 
   image.Init(bench::Shrunk(512), bench::Shrunk(512), ImageDataType_U8, sequence,
              ImageDataOrder_Pixel, 4);
   bench::Fill(image);
-  const Screen screen;
+  const Screen screen(kScreenWidth, kScreenHeight);
   const tagRECT target = screen.Rect();
   vIma2Device renderer;
   renderer.Init(&image, nullptr, &target, false, false);
@@ -75,7 +46,7 @@ void StretchBits(benchmark::State& state, const char* sequence) {
              ImageDataOrder_Pixel, 4);
   bench::Fill(image);
   dImaDescriptorDIB descriptor(image);
-  const Screen screen;
+  const Screen screen(kScreenWidth, kScreenHeight);
   const int edge = static_cast<int>(image.GetWidth());
   SetStretchBltMode(screen, COLORONCOLOR);
   Run(state, screen, [&] {
@@ -86,23 +57,23 @@ void StretchBits(benchmark::State& state, const char* sequence) {
 }
 
 void Copy(benchmark::State& state) {
-  const Screen source;
-  const Screen screen;
+  const Screen source(kScreenWidth, kScreenHeight);
+  const Screen screen(kScreenWidth, kScreenHeight);
   Run(state, screen, [&] {
     return BitBlt(screen, 0, 0, screen.Width(), screen.Height(), source, 0, 0, SRCCOPY) != 0;
   });
 }
 
 void Invert(benchmark::State& state) {
-  const Screen source;
-  const Screen screen;
+  const Screen source(kScreenWidth, kScreenHeight);
+  const Screen screen(kScreenWidth, kScreenHeight);
   Run(state, screen, [&] {
     return BitBlt(screen, 0, 0, screen.Width(), screen.Height(), source, 0, 0, SRCINVERT) != 0;
   });
 }
 
 void Fill(benchmark::State& state) {
-  const Screen screen;
+  const Screen screen(kScreenWidth, kScreenHeight);
   const HBRUSH brush = CreateSolidBrush(0x302010);
   const tagRECT rect = screen.Rect();
   Run(state, screen, [&] { return FillRect(screen, &rect, brush) != 0; });
@@ -116,7 +87,7 @@ void Memcpy(benchmark::State& state) {
 
 // A thousand lines over the screen in all directions.
 void Lines(benchmark::State& state, int width) {
-  const Screen screen;
+  const Screen screen(kScreenWidth, kScreenHeight);
   const HPEN pen = CreatePen(PS_SOLID, width, 0x302010);
   const HGDIOBJ old = SelectObject(screen, pen);
   constexpr int kCount = 1000;
