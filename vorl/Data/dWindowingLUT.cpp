@@ -104,6 +104,16 @@ int dWindowingLUT::GetWinWidth() const {
   return m_width;
 }
 
+void dWindowingLUT::GetTargetRange(unsigned char& low, unsigned char& high) const {
+  low = m_targetLow;
+  high = m_targetHigh;
+}
+
+void dWindowingLUT::GetLimits(unsigned char& lower, unsigned char& upper) const {
+  lower = m_lowerLimit;
+  upper = m_upperLimit;
+}
+
 // Null when there is none, or when its table was taken away.
 const unsigned char* dWindowingLUT::FetchSecondStage() const {
   if (m_pBCGLUT == nullptr) {

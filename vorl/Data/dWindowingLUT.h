@@ -47,6 +47,8 @@ class VORL_API dWindowingLUT : public dLUT {
   void SetBCGLUT(dBCGLUT* lut);
   int GetWinCenter() const;
   int GetWinWidth() const;
+  void GetTargetRange(unsigned char& low, unsigned char& high) const;
+  void GetLimits(unsigned char& lower, unsigned char& upper) const;
 
  protected:
   /// Refuses: the format is fixed. Sets "Don't call 'Init' for a 'dWindowingLUT' object. It has

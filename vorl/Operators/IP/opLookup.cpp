@@ -1,9 +1,14 @@
 #include <vorl/Operators/IP/opLookup.h>
 
+#include <cstdint>
+#include <optional>
+
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Data/dWindowingLUT.h>
 #include <vorl/Operators/IP/kernels/ImageCheck.h>
 #include <vorl/Operators/IP/kernels/Pixels.h>
 #include <vorl/Operators/IP/kernels/RowLoop.h>
+#include <vorl/Operators/IP/kernels/WindowRamp.h>
 
 inline namespace vorl {
 
@@ -11,14 +16,53 @@ namespace {
 
 enum LookupMode { kNone = -1, kEightToEight = 0, kSixteenToEight = 1 };
 
-template <class T>
+/// Calls `map(source, target, count)` for the samples of each row.
+template <class T, class Map>
 bool MapRows(const vorl_detail::RunControl& control, const dImage& source, const dImage& target,
-             const vorl_detail::LookupTable& table) {
+             Map&& map) {
+  const std::size_t count = source.GetDataSamplesInRow();
   return vorl_detail::ForEachRow(control, source.GetNumRows(), [&](std::size_t row) {
-    vorl_detail::LookupRunRef(vorl_detail::RowOf<const T>(source, row),
-                              vorl_detail::RowOf<std::uint8_t>(target, row),
-                              source.GetDataSamplesInRow(), table);
+    map(vorl_detail::RowOf<const T>(source, row), vorl_detail::RowOf<std::uint8_t>(target, row),
+        count);
   });
+}
+
+template <class T>
+bool LookUpRows(const vorl_detail::RunControl& control, const dImage& source, const dImage& target,
+                const vorl_detail::LookupTable& table) {
+  return MapRows<T>(control, source, target,
+                    [&](const T* from, std::uint8_t* to, std::size_t count) {
+                      vorl_detail::LookupRunRef(from, to, count, table);
+                    });
+}
+
+/// The same for samples of 8 bits, of which there are only 256.
+template <class T>
+bool MapByteRows(const vorl_detail::RunControl& control, const dImage& source, const dImage& target,
+                 const vorl_detail::LookupTable& table) {
+  std::uint8_t entries[256];
+  for (unsigned i = 0; i < 256; ++i) {
+    const auto sample = static_cast<T>(i);
+    vorl_detail::LookupRunRef(&sample, entries + i, 1, table);
+  }
+  return MapRows<std::uint8_t>(
+      control, source, target, [&](const std::uint8_t* from, std::uint8_t* to, std::size_t count) {
+        vorl_detail::ActivePixelKernels().mapBytes(from, to, count, entries);
+      });
+}
+
+/// Looking for the arithmetic form of a table takes as long as some hundred thousand look-ups.
+constexpr std::uint64_t kFewSamples = 1U << 18;
+
+// The table's arithmetic form, where it has one and the image is worth the search for it.
+std::optional<vorl_detail::WindowRamp> FindRamp(const dImage& source, dLUT& lut) {
+  auto* const window = dynamic_cast<dWindowingLUT*>(&lut);
+  if (window == nullptr || source.GetChannelDepth() != 16 ||
+      std::uint64_t{source.GetNumRows()} * source.GetDataSamplesInRow() < kFewSamples) {
+    return std::nullopt;
+  }
+  return vorl_detail::WindowRamp::Of(*window, source.IsSigned(),
+                                     vorl_detail::ActivePixelKernels().window);
 }
 
 // The application may have exchanged the table's buffer through its image.
@@ -103,19 +147,25 @@ bool opLookup::Map(const dImage& source, const dImage& target) {
   const std::uint8_t* entries = m_pLUT->GetLUT(0);
   const vorl_detail::LookupTable table{entries, m_pLUT->GetStartIndex(), m_pLUT->GetSize()};
   const vorl_detail::RunControl control{m_stopRequested, m_progress};
+  if (const auto ramp = FindRamp(source, *m_pLUT)) {
+    const auto map = [&](const std::uint16_t* from, std::uint8_t* to, std::size_t count) {
+      vorl_detail::ActivePixelKernels().window(from, to, count, *ramp);
+    };
+    return MapRows<std::uint16_t>(control, source, target, map) || Stopped();
+  }
   bool finished = false;
   switch (source.GetDataType()) {
     case ImageDataType_U8:
-      finished = MapRows<std::uint8_t>(control, source, target, table);
+      finished = MapByteRows<std::uint8_t>(control, source, target, table);
       break;
     case ImageDataType_S8:
-      finished = MapRows<std::int8_t>(control, source, target, table);
+      finished = MapByteRows<std::int8_t>(control, source, target, table);
       break;
     case ImageDataType_U16:
-      finished = MapRows<std::uint16_t>(control, source, target, table);
+      finished = LookUpRows<std::uint16_t>(control, source, target, table);
       break;
     default:  // the last type of 8 or 16 bits
-      finished = MapRows<std::int16_t>(control, source, target, table);
+      finished = LookUpRows<std::int16_t>(control, source, target, table);
       break;
   }
   return finished || Stopped();

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <tuple>
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/ImageCheck.h>
@@ -94,9 +95,11 @@ bool opMinMax::Search() {
   }
   std::int32_t minimum = m_minimum;
   std::int32_t maximum = m_maximum;
+  vorl_detail::MinMaxRun<T>* const search =
+      std::get<vorl_detail::MinMaxRun<T>*>(vorl_detail::ActivePixelKernels().minMax);
   const auto row = [&](std::size_t index) {
-    vorl_detail::MinMaxRunRef(vorl_detail::RowOf<const T>(*m_pSource, index),
-                              m_pSource->GetDataSamplesInRow(), minimum, maximum);
+    search(vorl_detail::RowOf<const T>(*m_pSource, index), m_pSource->GetDataSamplesInRow(),
+           minimum, maximum);
   };
   if (!vorl_detail::ForEachRow({m_stopRequested, m_progress}, m_pSource->GetNumRows(), row)) {
     return Stopped();

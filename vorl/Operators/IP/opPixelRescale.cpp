@@ -1,5 +1,9 @@
 #include <vorl/Operators/IP/opPixelRescale.h>
 
+#include <cstdint>
+#include <numeric>
+#include <tuple>
+
 #include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/ImageCheck.h>
@@ -7,6 +11,48 @@
 #include <vorl/Operators/IP/kernels/RowLoop.h>
 
 inline namespace vorl {
+
+namespace {
+
+/// Rescales runs of samples.
+template <class T>
+class Rescaler {
+ public:
+  Rescaler(double factor, double offset) : m_factor(factor), m_offset(offset) {}
+
+  void operator()(const T* source, T* target, std::size_t count) const {
+    m_rescale(source, target, count, m_factor, m_offset);
+  }
+
+ private:
+  vorl_detail::RescaleRun<T>* m_rescale =
+      std::get<vorl_detail::RescaleRun<T>*>(vorl_detail::ActivePixelKernels().rescale);
+  double m_factor;
+  double m_offset;
+};
+
+/// There are only 256 samples of 8 bits: they are rescaled once, and looked up.
+template <class T>
+requires(sizeof(T) == 1) class Rescaler<T> {
+ public:
+  Rescaler(double factor, double offset) {
+    T samples[256];
+    std::iota(reinterpret_cast<std::uint8_t*>(samples),
+              reinterpret_cast<std::uint8_t*>(samples) + 256, std::uint8_t{0});
+    vorl_detail::RescaleRunRef(samples, reinterpret_cast<T*>(m_entries), 256, factor, offset);
+  }
+
+  void operator()(const T* source, T* target, std::size_t count) const {
+    vorl_detail::ActivePixelKernels().mapBytes(reinterpret_cast<const std::uint8_t*>(source),
+                                               reinterpret_cast<std::uint8_t*>(target), count,
+                                               m_entries);
+  }
+
+ private:
+  std::uint8_t m_entries[256];
+};
+
+}  // namespace
 
 VORL_REGISTER_CLASS(opPixelRescale, OpBase);
 
@@ -114,8 +160,9 @@ bool opPixelRescale::Rescale(dImage* source, dImage* target, double factor, doub
       return false;
     }
   }
+  const Rescaler<T> rescale(factor, offset);
   const auto row = [&](std::size_t index) {
-    vorl_detail::RescaleRunRef(from + index * length, to + index * length, length, factor, offset);
+    rescale(from + index * length, to + index * length, length);
   };
   return vorl_detail::ForEachRow({m_stopRequested, m_progress}, source->GetNumRows(), row) ||
          Stopped();

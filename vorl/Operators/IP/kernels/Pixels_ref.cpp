@@ -41,6 +41,13 @@ void RescaleRunRef(const T* source, T* target, std::size_t count, double factor,
   }
 }
 
+void MapBytesRunRef(const std::uint8_t* source, std::uint8_t* target, std::size_t count,
+                    const std::uint8_t* entries) {
+  for (std::size_t i = 0; i < count; ++i) {
+    target[i] = entries[source[i]];
+  }
+}
+
 template void LookupRunRef(const std::uint8_t*, std::uint8_t*, std::size_t, const LookupTable&);
 template void LookupRunRef(const std::int8_t*, std::uint8_t*, std::size_t, const LookupTable&);
 template void LookupRunRef(const std::uint16_t*, std::uint8_t*, std::size_t, const LookupTable&);

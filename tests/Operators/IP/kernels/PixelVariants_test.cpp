@@ -1,0 +1,242 @@
+// Every variant of the pixel loops that can run here gives the same bits as the plain loops, for
+// every length up to four registers and one sample more, at every misalignment, on random samples
+// and the extremes, and touches nothing beside its run.
+#include <vorl/Operators/IP/kernels/Pixels.h>
+#include <vorl/Operators/IP/kernels/WindowRamp.h>
+
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <limits>
+#include <random>
+#include <string>
+#include <tuple>
+#include <vector>
+
+#include <vorl/Data/dBCGLUT.h>
+#include <vorl/Data/dWindowingLUT.h>
+
+namespace {
+
+using vorl_detail::CpuVariant;
+using vorl_detail::PixelKernels;
+using vorl_detail::WindowRamp;
+
+// Four AVX-512 registers of bytes, and one byte.
+constexpr std::size_t kLongest = 4 * 64 + 1;
+constexpr std::size_t kGuard = 64;
+
+class PixelVariants : public testing::TestWithParam<CpuVariant> {
+ protected:
+  void SetUp() override {
+    if (!vorl_detail::CanRun(GetParam())) {
+      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
+    }
+  }
+  const PixelKernels& Kernels() const { return vorl_detail::PixelKernelsOf(GetParam()); }
+};
+
+INSTANTIATE_TEST_SUITE_P(, PixelVariants, testing::ValuesIn(vorl_detail::kCpuVariants),
+                         [](const auto& variant) {
+                           return std::string(vorl_detail::NameOf(variant.param));
+                         });
+
+template <class T>
+std::vector<T> RandomSamples(std::size_t count, std::mt19937& random) {
+  std::vector<T> samples(count);
+  for (T& sample : samples) {
+    const unsigned choice = random() % 16;
+    sample = choice == 0   ? std::numeric_limits<T>::min()
+             : choice == 1 ? std::numeric_limits<T>::max()
+                           : static_cast<T>(random());
+  }
+  return samples;
+}
+
+// Calls `check(samples, count)` with runs of every length and misalignment. Behind the run stands
+// memory that the address sanitizer watches, as each run ends with its block.
+template <class T, class Check>
+void ForEachRun(Check check) {
+  std::mt19937 random(7);
+  for (std::size_t count = 0; count <= kLongest; ++count) {
+    const std::size_t shift = random() % 32;
+    const std::vector<T> block = RandomSamples<T>(shift + count, random);
+    check(block.data() + shift, count);
+  }
+}
+
+template <class T>
+void ExpectSameExtremes(const PixelKernels& kernels) {
+  ForEachRun<T>([&](const T* samples, std::size_t count) {
+    for (const auto& [low, high] : {std::pair(INT32_MAX, INT32_MIN), std::pair(-3, 3)}) {
+      std::int32_t expectedLow = low, expectedHigh = high, givenLow = low, givenHigh = high;
+      vorl_detail::MinMaxRunRef(samples, count, expectedLow, expectedHigh);
+      std::get<vorl_detail::MinMaxRun<T>*>(kernels.minMax)(samples, count, givenLow, givenHigh);
+      ASSERT_EQ(givenLow, expectedLow) << count << " samples";
+      ASSERT_EQ(givenHigh, expectedHigh) << count << " samples";
+    }
+  });
+}
+
+TEST_P(PixelVariants, MinMaxEqualsThePlainLoop) {
+  ExpectSameExtremes<std::uint8_t>(Kernels());
+  ExpectSameExtremes<std::int8_t>(Kernels());
+  ExpectSameExtremes<std::uint16_t>(Kernels());
+  ExpectSameExtremes<std::int16_t>(Kernels());
+  ExpectSameExtremes<std::int32_t>(Kernels());
+}
+
+constexpr double kInfinity = std::numeric_limits<double>::infinity();
+constexpr double kScalings[][2] = {{1.5, 3.2},
+                                   {-0.7, 200},
+                                   {0, 0},
+                                   {1e308, -1e308},
+                                   {-1e-320, 0.999999},
+                                   {2.0 / 3, -0.5},
+                                   {kInfinity, 0},
+                                   {1, -kInfinity},
+                                   {1, kInfinity},
+                                   {0, kInfinity},
+                                   {-1, 65535},
+                                   {1.0000001, -1},
+                                   {std::numeric_limits<double>::quiet_NaN(), 1},
+                                   {1, std::numeric_limits<double>::quiet_NaN()}};
+
+template <class T>
+void ExpectSameScaling(const PixelKernels& kernels) {
+  const auto rescale = std::get<vorl_detail::RescaleRun<T>*>(kernels.rescale);
+  ForEachRun<T>([&](const T* samples, std::size_t count) {
+    for (const auto& [factor, offset] : kScalings) {
+      std::vector<T> expected(count);
+      vorl_detail::RescaleRunRef(samples, expected.data(), count, factor, offset);
+      std::vector<T> given(count + kGuard, T{77});
+      rescale(samples, given.data(), count, factor, offset);
+      for (std::size_t i = 0; i < given.size(); ++i) {
+        ASSERT_EQ(given[i], i < count ? expected[i] : T{77})
+            << i << " of " << count << ", * " << factor << " + " << offset;
+      }
+      std::vector<T> inPlace(samples, samples + count);
+      rescale(inPlace.data(), inPlace.data(), count, factor, offset);
+      ASSERT_EQ(inPlace, expected) << count << ", * " << factor << " + " << offset;
+    }
+  });
+}
+
+TEST_P(PixelVariants, RescaleEqualsThePlainLoop) {
+  ExpectSameScaling<std::uint16_t>(Kernels());
+  ExpectSameScaling<std::int16_t>(Kernels());
+}
+
+TEST_P(PixelVariants, MappedBytesAreThePlainLoops) {
+  std::mt19937 random(3);
+  const std::vector<std::uint8_t> entries = RandomSamples<std::uint8_t>(256, random);
+  ForEachRun<std::uint8_t>([&](const std::uint8_t* samples, std::size_t count) {
+    std::vector<std::uint8_t> given(count + kGuard, 77);
+    Kernels().mapBytes(samples, given.data(), count, entries.data());
+    std::vector<std::uint8_t> inPlace(samples, samples + count);
+    Kernels().mapBytes(inPlace.data(), inPlace.data(), count, entries.data());
+    for (std::size_t i = 0; i < given.size(); ++i) {
+      ASSERT_EQ(given[i], i < count ? entries[samples[i]] : 77) << i << " of " << count;
+      ASSERT_TRUE(i >= count || inPlace[i] == given[i]) << i << " of " << count << " in place";
+    }
+  });
+}
+
+// Every sample there is, and every length of a run, through the ramp and through the table.
+void ExpectRampEqualsTable(dWindowingLUT& lut, bool isSigned, const PixelKernels& kernels) {
+  const auto ramp = WindowRamp::Of(lut, isSigned, kernels.window);
+  ASSERT_TRUE(ramp) << lut.GetWinCenter() << " / " << lut.GetWinWidth();
+  std::vector<std::uint16_t> samples(65536);
+  for (std::size_t i = 0; i < samples.size(); ++i) {
+    samples[i] = static_cast<std::uint16_t>(i);
+  }
+  std::vector<std::uint8_t> given(samples.size());
+  kernels.window(samples.data(), given.data(), samples.size(), *ramp);
+  const std::uint8_t* const entries = lut.GetLUT(0);
+  for (std::size_t i = 0; i < samples.size(); ++i) {
+    ASSERT_EQ(given[i], entries[isSigned ? i ^ 0x8000U : i])
+        << "sample " << i << " of " << lut.GetWinCenter() << " / " << lut.GetWinWidth();
+  }
+}
+
+TEST_P(PixelVariants, WindowEqualsTheTable) {
+  if (Kernels().window == nullptr) {
+    ASSERT_EQ(GetParam(), CpuVariant::Reference);  // which looks every sample up
+    return;
+  }
+  dWindowingLUT lut;
+  for (const bool isSigned : {false, true}) {
+    lut.SetSignedSource(isSigned);
+    const int base = isSigned ? -32768 : 0;
+    for (const int width : {2, 3, 100, 254, 255, 256, 350, 400, 1500, 2000, 4096, 65535, 65536}) {
+      for (const int center : {1, 1064, 32768, 65000}) {
+        lut.SetWindow(base + center, width);
+        ExpectRampEqualsTable(lut, isSigned, Kernels());
+      }
+    }
+    lut.SetTargetRange(200, 10);
+    lut.SetLimits(3, 255);
+    for (const int width : {2, 90, 1500, 65536}) {
+      lut.SetWindow(base + 20000, width);
+      ExpectRampEqualsTable(lut, isSigned, Kernels());
+    }
+    lut.SetTargetRange(0, 255);
+    lut.SetLimits(0, 255);
+  }
+}
+
+TEST_P(PixelVariants, WindowOfAnyLengthStaysInItsRun) {
+  if (Kernels().window == nullptr) {
+    ASSERT_EQ(GetParam(), CpuVariant::Reference);
+    return;
+  }
+  dWindowingLUT lut;
+  lut.SetWindow(30000, 40000);
+  for (const bool hasEnds : {false, true}) {
+    lut.SetLimits(hasEnds ? 9 : 0, 255);
+    const auto ramp = WindowRamp::Of(lut, false, Kernels().window);
+    ASSERT_TRUE(ramp);
+    ForEachRun<std::uint16_t>([&](const std::uint16_t* samples, std::size_t count) {
+      std::vector<std::uint8_t> given(count + kGuard, 77);
+      Kernels().window(samples, given.data(), count, *ramp);
+      for (std::size_t i = 0; i < given.size(); ++i) {
+        ASSERT_EQ(given[i], i < count ? lut.GetLUT(0)[samples[i]] : 77) << i << " of " << count;
+      }
+    });
+  }
+}
+
+TEST(WindowRamp, TablesWithoutALineHaveNone) {
+  vorl_detail::WindowRun* const run =
+      vorl_detail::PixelKernelsOf(vorl_detail::ChooseVariant(nullptr)).window;
+  dWindowingLUT lut;
+  lut.SetWindow(1000, 1500);
+  EXPECT_EQ(WindowRamp::Of(lut, false, run).has_value(), run != nullptr);
+  EXPECT_FALSE(WindowRamp::Of(lut, true, run)) << "an unsigned table, signed samples";
+  EXPECT_FALSE(WindowRamp::Of(lut, false, nullptr));
+  for (int i = 0; i < 5; ++i) {  // more entries changed by hand than a ramp can name
+    lut.GetLUT(0)[900 + 40 * i] ^= 0x80;
+  }
+  EXPECT_FALSE(WindowRamp::Of(lut, false, run));
+  dBCGLUT curve;
+  curve.SetGamma(2);
+  lut.SetBCGLUT(&curve);
+  EXPECT_FALSE(WindowRamp::Of(lut, false, run));
+}
+
+TEST(WindowRamp, EntryChangedByHandOutsideTheLineIsNotOverlooked) {
+  vorl_detail::WindowRun* const run =
+      vorl_detail::PixelKernelsOf(vorl_detail::ChooseVariant(nullptr)).window;
+  dWindowingLUT lut;
+  lut.SetWindow(1000, 400);
+  for (const int index : {0, 799, 1200, 65535}) {
+    std::uint8_t& entry = lut.GetLUT(0)[index];
+    const std::uint8_t before = entry;
+    entry ^= 1;
+    EXPECT_FALSE(WindowRamp::Of(lut, false, run)) << index;
+    entry = before;
+  }
+  EXPECT_EQ(WindowRamp::Of(lut, false, run).has_value(), run != nullptr);
+}
+
+}  // namespace

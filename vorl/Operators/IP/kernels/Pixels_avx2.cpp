@@ -1,0 +1,12 @@
+#include <vorl/Operators/IP/kernels/Words_avx2.h>
+// Lanes first: the loops are made of them.
+#include <vorl/Operators/IP/kernels/Pixels_body.h>
+
+inline namespace vorl {
+namespace vorl_detail {
+
+extern const PixelKernels kPixelKernelsAvx2;
+const PixelKernels kPixelKernelsAvx2 = kKernels;
+
+}  // namespace vorl_detail
+}  // namespace vorl

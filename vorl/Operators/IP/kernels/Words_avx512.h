@@ -1,0 +1,107 @@
+// Thirty-two lanes of 16 bits in an AVX-512 register.
+
+#include <immintrin.h>
+
+#include <cstddef>
+#include <cstdint>
+
+inline namespace vorl {
+namespace vorl_detail {
+namespace {
+
+class Words {
+ public:
+  using Mask = __mmask32;
+  static constexpr std::size_t kCount = 32;
+
+  static Words All(int value) { return _mm512_set1_epi16(static_cast<short>(value)); }
+  static Words Load(const void* samples) { return _mm512_loadu_si512(samples); }
+  void Store(void* samples) const { _mm512_storeu_si512(samples, m_lanes); }
+  /// Lanes below 256 as bytes, those of `low` first.
+  static void StoreBytes(const Words& low, const Words& high, std::uint8_t* target) {
+    const __m512i mixed = _mm512_packus_epi16(low.m_lanes, high.m_lanes);
+    const __m512i order = _mm512_set_epi64(7, 5, 3, 1, 6, 4, 2, 0);
+    _mm512_storeu_si512(target, _mm512_permutexvar_epi64(order, mixed));
+  }
+
+  Words Xor(const Words& other) const { return _mm512_xor_si512(m_lanes, other.m_lanes); }
+  Words Min(const Words& other) const { return _mm512_min_epu16(m_lanes, other.m_lanes); }
+  Words SubtractSaturated(const Words& other) const {
+    return _mm512_subs_epu16(m_lanes, other.m_lanes);
+  }
+  Mask Equals(const Words& other) const { return _mm512_cmpeq_epi16_mask(m_lanes, other.m_lanes); }
+  Mask IsNonZero() const { return _mm512_test_epi16_mask(m_lanes, m_lanes); }
+  Words Replaced(const Mask& where, const Words& other) const {
+    return _mm512_mask_mov_epi16(m_lanes, where, other.m_lanes);
+  }
+  /// lane * factor + offset in single precision, truncated; to be 0 to 65535.
+  Words Line(float factor, float offset) const {
+    const __m512i zero = _mm512_setzero_si512();
+    return _mm512_packus_epi32(LineOf(_mm512_unpacklo_epi16(m_lanes, zero), factor, offset),
+                               LineOf(_mm512_unpackhi_epi16(m_lanes, zero), factor, offset));
+  }
+  /// lane * factor + offset in double precision, truncated and saturated.
+  Words ScaledUnsigned(double factor, double offset) const {
+    const __m512i zero = _mm512_setzero_si512();
+    return _mm512_packus_epi32(
+        ScaledSixteen(_mm512_unpacklo_epi16(m_lanes, zero), factor, offset, 65535),
+        ScaledSixteen(_mm512_unpackhi_epi16(m_lanes, zero), factor, offset, 65535));
+  }
+  Words ScaledSigned(double factor, double offset) const {
+    const __m512i low = _mm512_srai_epi32(_mm512_unpacklo_epi16(m_lanes, m_lanes), 16);
+    const __m512i high = _mm512_srai_epi32(_mm512_unpackhi_epi16(m_lanes, m_lanes), 16);
+    return _mm512_packs_epi32(ScaledSixteen(low, factor, offset, 32767),
+                              ScaledSixteen(high, factor, offset, 32767));
+  }
+
+ private:
+  Words(__m512i lanes) : m_lanes(lanes) {}
+
+  static __m512i LineOf(__m512i numbers, float factor, float offset) {
+    const __m512 product = _mm512_mul_ps(_mm512_cvtepi32_ps(numbers), _mm512_set1_ps(factor));
+    return _mm512_cvttps_epi32(_mm512_add_ps(product, _mm512_set1_ps(offset)));
+  }
+
+  static __m512i ScaledSixteen(__m512i numbers, double factor, double offset, double highest) {
+    const __m256i low = ScaledEight(_mm512_castsi512_si256(numbers), factor, offset, highest);
+    const __m256i high =
+        ScaledEight(_mm512_extracti64x4_epi64(numbers, 1), factor, offset, highest);
+    return _mm512_inserti64x4(_mm512_castsi256_si512(low), high, 1);
+  }
+  static __m256i ScaledEight(__m256i numbers, double factor, double offset, double highest) {
+    const __m512d product = _mm512_mul_pd(_mm512_cvtepi32_pd(numbers), _mm512_set1_pd(factor));
+    const __m512d sum = _mm512_add_pd(product, _mm512_set1_pd(offset));
+    // What is too low to be converted becomes the lowest number, which the packing saturates.
+    return _mm512_cvttpd_epi32(_mm512_min_pd(sum, _mm512_set1_pd(highest)));
+  }
+
+  __m512i m_lanes;
+};
+
+/// 256 bytes in four registers.
+class ByteTable {
+ public:
+  explicit ByteTable(const std::uint8_t* entries)
+      : m_quarters{_mm512_loadu_si512(entries), _mm512_loadu_si512(entries + 64),
+                   _mm512_loadu_si512(entries + 128), _mm512_loadu_si512(entries + 192)} {}
+
+  /// Maps as many whole registers as there are; returns the number of bytes.
+  std::size_t MapRegisters(const std::uint8_t* source, std::uint8_t* target,
+                           std::size_t count) const {
+    std::size_t i = 0;
+    for (; i + 64 <= count; i += 64) {
+      const __m512i index = _mm512_loadu_si512(source + i);
+      const __m512i low = _mm512_permutex2var_epi8(m_quarters[0], index, m_quarters[1]);
+      const __m512i high = _mm512_permutex2var_epi8(m_quarters[2], index, m_quarters[3]);
+      _mm512_storeu_si512(target + i, _mm512_mask_mov_epi8(low, _mm512_movepi8_mask(index), high));
+    }
+    return i;
+  }
+
+ private:
+  __m512i m_quarters[4];
+};
+
+}  // namespace
+}  // namespace vorl_detail
+}  // namespace vorl
