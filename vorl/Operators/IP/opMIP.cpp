@@ -1,7 +1,7 @@
 // 1. Prepare checks the inputs.
 // 2. Process picks the worker for algorithm and data type.
 // 3. The slab workers walk the output rows like a thick reconstruction and keep the largest sample
-//    (Mip.h); the voxel-list worker carries listed voxels into the slice.
+//    (RowSampler, Mip.h); the voxel-list worker carries listed voxels into the slice.
 
 #include <vorl/Operators/IP/opMIP.h>
 
@@ -10,6 +10,7 @@
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/Mip.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
+#include <vorl/Operators/IP/kernels/RowSampler.h>
 #include <vorl/Operators/IP/kernels/SamplingCheck.h>
 #include <vorl/Operators/IP/kernels/VolumeProjection.h>
 
@@ -101,8 +102,13 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
   const Sampler sampler(view);
   const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), vorl_detail::kSlabBegin);
   const SlabSamples slab(plane.depthStep, depthSteps);
+  vorl_detail::RowSampler<T> rows(view, algoID == MIPAlgo_Trilinear, vorl_detail::ActiveVariant());
   const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
-    MipRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
+    if (rows.Maximum(slab, point, plane.columnStep, pixels, width)) {
+      point += plane.columnStep.Times(static_cast<std::int32_t>(width));
+    } else {
+      MipRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
+    }
   };
   vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
   return true;

@@ -1,14 +1,16 @@
 // 1. Prepare checks the inputs.
 // 2. Process picks the worker for algorithm, data type and thickness.
 // 3. A worker carries the output plane into voxel coordinates (SlicePlane), looks at the volume's
-//    pixels through a validated view (VolumeView), and walks the output rows; each row is one call
-//    of a kernel (Mpr.h) with a sampler (Sampling.h).
+//    pixels through a validated view (VolumeView), and walks the output rows. A row is done by the
+//    kernels of the active variant (RowSampler) or, where those do not apply, by the plain loop
+//    (Mpr.h) with a sampler (Sampling.h).
 
 #include <vorl/Operators/IP/opMPR.h>
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
+#include <vorl/Operators/IP/kernels/RowSampler.h>
 #include <vorl/Operators/IP/kernels/SamplingCheck.h>
 
 inline namespace vorl {
@@ -90,8 +92,13 @@ bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
   const vorl_detail::SlicePlane plane(target, source.GetCoordinates(),
                                       thick ? vorl_detail::kSlabBegin : 0.0);
   const SlabSamples slab(plane.depthStep, depthSteps);
+  vorl_detail::RowSampler<T> rows(view, algoID == MPRAlgo_Trilinear, vorl_detail::ActiveVariant());
   const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
-    if (thick) {
+    const bool isDone = thick ? rows.Mean(slab, point, plane.columnStep, pixels, width)
+                              : rows.Thin(point, plane.columnStep, pixels, width);
+    if (isDone) {
+      point += plane.columnStep.Times(static_cast<std::int32_t>(width));
+    } else if (thick) {
       MprThickRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
     } else {
       MprThinRowRef(view, sampler, point, plane.columnStep, pixels, width);

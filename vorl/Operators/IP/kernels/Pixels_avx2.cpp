@@ -1,4 +1,4 @@
-#include <vorl/Operators/IP/kernels/Words_avx2.h>
+#include <vorl/Operators/IP/kernels/Lanes_avx2.h>
 // Lanes first: the loops are made of them.
 #include <vorl/Operators/IP/kernels/Pixels_body.h>
 

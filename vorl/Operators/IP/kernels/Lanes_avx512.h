@@ -1,4 +1,4 @@
-// Thirty-two lanes of 16 bits in an AVX-512 register.
+// Lanes of 16 and 32 bits in AVX-512 registers.
 
 #include <immintrin.h>
 
@@ -9,6 +9,90 @@ inline namespace vorl {
 namespace vorl_detail {
 namespace {
 
+/// 32 bits each, signed.
+class Numbers {
+ public:
+  using Mask = __mmask16;
+  static constexpr std::size_t kCount = 16;
+
+  static Numbers All(std::int32_t value) { return _mm512_set1_epi32(value); }
+  /// 0, 1, 2 ...
+  static Numbers Lanes() {
+    return _mm512_setr_epi32(0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15);
+  }
+  static Numbers Load(const std::int32_t* numbers) { return _mm512_loadu_si512(numbers); }
+  void Store(std::int32_t* numbers) const { _mm512_storeu_si512(numbers, m_lanes); }
+  static Numbers LoadSamples(const std::uint16_t* samples) {
+    return _mm512_cvtepu16_epi32(LoadHalf(samples));
+  }
+  static Numbers LoadSamples(const std::int16_t* samples) {
+    return _mm512_cvtepi16_epi32(LoadHalf(samples));
+  }
+  /// The low 16 bits of each lane.
+  void StoreLow(void* samples) const {
+    _mm256_storeu_si256(static_cast<__m256i*>(samples), _mm512_cvtepi32_epi16(m_lanes));
+  }
+  static Numbers Gather(const std::int32_t* table, const Numbers& index) {
+    return _mm512_i32gather_epi32(index.m_lanes, table, 4);
+  }
+  /// Two neighbouring samples of 16 bits each, the first one in the low half.
+  static Numbers GatherPairs(const void* samples, const Numbers& index) {
+    return _mm512_i32gather_epi32(index.m_lanes, samples, 2);
+  }
+
+  Numbers operator+(const Numbers& other) const { return _mm512_add_epi32(m_lanes, other.m_lanes); }
+  Numbers operator-(const Numbers& other) const { return _mm512_sub_epi32(m_lanes, other.m_lanes); }
+  /// The low 32 bits of the products.
+  Numbers operator*(const Numbers& other) const {
+    return _mm512_mullo_epi32(m_lanes, other.m_lanes);
+  }
+  Numbers operator&(const Numbers& other) const { return _mm512_and_si512(m_lanes, other.m_lanes); }
+  Numbers Min(const Numbers& other) const { return _mm512_min_epi32(m_lanes, other.m_lanes); }
+  Numbers Max(const Numbers& other) const { return _mm512_max_epi32(m_lanes, other.m_lanes); }
+  /// By 16 bits, with the sign.
+  Numbers ShiftedRight() const { return _mm512_srai_epi32(m_lanes, 16); }
+  /// The halves of pairs of samples.
+  template <class T>
+  Numbers LowSample() const {
+    if constexpr (static_cast<T>(-1) < 0) {
+      return _mm512_srai_epi32(_mm512_slli_epi32(m_lanes, 16), 16);
+    } else {
+      return _mm512_and_si512(m_lanes, _mm512_set1_epi32(0xFFFF));
+    }
+  }
+  template <class T>
+  Numbers HighSample() const {
+    if constexpr (static_cast<T>(-1) < 0) {
+      return _mm512_srai_epi32(m_lanes, 16);
+    } else {
+      return _mm512_srli_epi32(m_lanes, 16);
+    }
+  }
+  Mask Equals(const Numbers& other) const {
+    return _mm512_cmpeq_epi32_mask(m_lanes, other.m_lanes);
+  }
+  Mask IsBelow(const Numbers& other) const {
+    return _mm512_cmplt_epi32_mask(m_lanes, other.m_lanes);
+  }
+  Numbers Replaced(const Mask& where, const Numbers& other) const {
+    return _mm512_mask_mov_epi32(m_lanes, where, other.m_lanes);
+  }
+  /// 0 elsewhere.
+  Numbers Where(const Mask& mask) const { return _mm512_maskz_mov_epi32(mask, m_lanes); }
+
+ private:
+  friend class Words;
+
+  Numbers(__m512i lanes) : m_lanes(lanes) {}
+
+  static __m256i LoadHalf(const void* samples) {
+    return _mm256_loadu_si256(static_cast<const __m256i*>(samples));
+  }
+
+  __m512i m_lanes;
+};
+
+/// 16 bits each.
 class Words {
  public:
   using Mask = __mmask32;
@@ -24,6 +108,25 @@ class Words {
     _mm512_storeu_si512(target, _mm512_permutexvar_epi64(order, mixed));
   }
 
+  Words() = default;
+
+  Words operator+(const Words& other) const { return _mm512_add_epi16(m_lanes, other.m_lanes); }
+  Words operator-(const Words& other) const { return _mm512_sub_epi16(m_lanes, other.m_lanes); }
+  Words operator&(const Words& other) const { return _mm512_and_si512(m_lanes, other.m_lanes); }
+  Words operator|(const Words& other) const { return _mm512_or_si512(m_lanes, other.m_lanes); }
+  Words MaxSigned(const Words& other) const { return _mm512_max_epi16(m_lanes, other.m_lanes); }
+  /// The high 16 bits of the products of signed lanes.
+  Words HighProduct(const Words& other) const { return _mm512_mulhi_epi16(m_lanes, other.m_lanes); }
+  bool IsZero() const { return _mm512_test_epi32_mask(m_lanes, m_lanes) == 0; }
+  /// The first and the last half of the lanes, as samples of a type.
+  template <class T>
+  Numbers LowNumbers() const {
+    return Widened<T>(_mm512_castsi512_si256(m_lanes));
+  }
+  template <class T>
+  Numbers HighNumbers() const {
+    return Widened<T>(_mm512_extracti64x4_epi64(m_lanes, 1));
+  }
   Words Xor(const Words& other) const { return _mm512_xor_si512(m_lanes, other.m_lanes); }
   Words Min(const Words& other) const { return _mm512_min_epu16(m_lanes, other.m_lanes); }
   Words SubtractSaturated(const Words& other) const {
@@ -55,6 +158,15 @@ class Words {
   }
 
  private:
+  template <class T>
+  static Numbers Widened(__m256i samples) {
+    if constexpr (static_cast<T>(-1) < 0) {
+      return _mm512_cvtepi16_epi32(samples);
+    } else {
+      return _mm512_cvtepu16_epi32(samples);
+    }
+  }
+
   Words(__m512i lanes) : m_lanes(lanes) {}
 
   static __m512i LineOf(__m512i numbers, float factor, float offset) {
