@@ -44,13 +44,17 @@ inline void MakeImage(dImage& image, unsigned long edge, unsigned short type) {
   Fill(image);
 }
 
-/// 512 x 512 x 300 voxels of 16 bits, made once.
+/// 512 x 512 x 300 voxels of 16 bits, of which 12 are used as by a scanner, made once.
 inline dVolume& Volume() {
   static dVolume* const volume = [] {
     static dVolume made;
     for (unsigned long z = 0; z < Shrunk(300); ++z) {
       dSlice slice;
-      MakeImage(slice.GetImage(), 512, ImageDataType_U16);
+      dImage& image = slice.GetImage();
+      MakeImage(image, 512, ImageDataType_U16);
+      auto* const voxels = static_cast<unsigned short*>(image.GetDataPtr());
+      std::for_each(voxels, voxels + image.GetNumDataSamples(),
+                    [](unsigned short& voxel) { voxel &= 0xFFF; });
       made.AddSlice(slice);
     }
     return &made;

@@ -1,7 +1,6 @@
 #include <vorl/Data/dBuffer.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <cstring>
 #include <functional>
 #include <limits>
@@ -10,6 +9,7 @@
 
 #include <vorl/Common/LogContext.h>
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Data/detail/Block.h>
 
 inline namespace vorl {
 
@@ -20,10 +20,10 @@ constexpr std::uint64_t kCapacityLimit = (std::uint64_t{1} << 32) - 8;
 constexpr std::uint64_t kSizeLimit = std::numeric_limits<std::uint32_t>::max();
 
 /// Frees a detached block at the end of a scope.
-struct FreeBlock {
-  void operator()(void* block) const { std::free(block); }
+struct DetachedBlockDeleter {
+  void operator()(void* block) const { vorl_detail::FreeBlock(block); }
 };
-using DetachedBlock = std::unique_ptr<void, FreeBlock>;
+using DetachedBlock = std::unique_ptr<void, DetachedBlockDeleter>;
 
 /// `size` rounded up to whole units; the last whole unit where 64 bits cannot hold more.
 std::uint64_t RoundUp(std::uint64_t size) {
@@ -102,7 +102,8 @@ dBuffer& dBuffer::New(unsigned long size, bool clear) {
     Delete();
     const std::uint64_t capacity = RoundUp(size);
     if (capacity < kCapacityLimit) {
-      m_data = static_cast<unsigned char*>(std::malloc(static_cast<std::size_t>(capacity)));
+      m_data = static_cast<unsigned char*>(
+          vorl_detail::AllocateBlock(static_cast<std::size_t>(capacity)));
     }
     if (m_data == nullptr) {
       ReportFailure(context, __LINE__, capacity);
@@ -192,7 +193,7 @@ dBuffer& dBuffer::Resize(unsigned long size) {
 }
 
 bool dBuffer::Delete() {
-  std::free(Detach());
+  vorl_detail::FreeBlock(Detach());
   return true;
 }
 

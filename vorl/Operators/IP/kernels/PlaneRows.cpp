@@ -19,6 +19,11 @@ std::int64_t FloorDivide(std::int64_t dividend, std::int64_t divisor) {
 // Cuts [begin, end) to the points with 0 <= start + i * step < limit.
 void Cut(std::int64_t start, std::int64_t step, std::int64_t limit, std::int64_t& begin,
          std::int64_t& end) {
+  const std::int64_t first = start + begin * step;
+  const std::int64_t last = start + (end - 1) * step;
+  if (first >= 0 && first < limit && last >= 0 && last < limit) {
+    return;  // the usual case, which needs no division
+  }
   if (step < 0) {  // the same points with the axis turned round
     start = limit - 1 - start;
     step = -step;
