@@ -80,7 +80,7 @@ bool opMIP::Process() {
     m_status.Set(false, "invalid MIP Algo ID: %d", algoID);
     return false;
   }
-  if (!vorl_detail::CheckSamples(*volume, *mipSlice, kSliceName, m_status)) {
+  if (!vorl_detail::CheckSampleType(*volume, m_status)) {
     return false;
   }
   const bool isSigned = volume->GetDataType() == ImageDataType_S16;
@@ -99,6 +99,9 @@ bool opMIP::Process() {
 template <class T, class Sampler>
 bool opMIP::Project(dVolume& source, dSlice& target) {
   const VolumeView view(source);
+  if (!vorl_detail::CheckSamples(view, target, kSliceName, m_status)) {
+    return false;
+  }
   const Sampler sampler(view);
   const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), vorl_detail::kSlabBegin);
   const SlabSamples slab(plane.depthStep, depthSteps);
@@ -121,6 +124,9 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
 template <class T>
 bool opMIP::ProjectList(dVolume& source, dBuffer& list, dSlice& target) {
   const VolumeView view(source);
+  if (!vorl_detail::CheckSamples(view, target, kSliceName, m_status)) {
+    return false;
+  }
   const NearestSampler<T> sampler(view);
   const vorl_detail::VoxelListView voxels(list);
   const vorl_detail::GridProjection toSlice(source.GetCoordinates(), target.GetCoordinates());

@@ -70,7 +70,7 @@ bool opMPR::Process() {
     m_status.Set(false, "invalid MPR Algo ID: %d", algoID);
     return false;
   }
-  if (!vorl_detail::CheckSamples(*volume, *mprSlice, kSliceName, m_status)) {
+  if (!vorl_detail::CheckSampleType(*volume, m_status)) {
     return false;
   }
   using Worker = bool (opMPR::*)(dVolume&, dSlice&);
@@ -88,6 +88,9 @@ bool opMPR::Process() {
 template <class T, class Sampler>
 bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
   const VolumeView view(source);
+  if (!vorl_detail::CheckSamples(view, target, kSliceName, m_status)) {
+    return false;
+  }
   const Sampler sampler(view);
   const vorl_detail::SlicePlane plane(target, source.GetCoordinates(),
                                       thick ? vorl_detail::kSlabBegin : 0.0);

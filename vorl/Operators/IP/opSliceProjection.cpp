@@ -160,7 +160,7 @@ bool opSliceProjection::Process() {
 bool opSliceProjection::CheckBuffers() {
   const bool readsVolume =
       algoID == SliceProjectionAlgo_Volume || algoID == SliceProjectionAlgo_VoxelList;
-  if (readsVolume && !vorl_detail::CheckPixels(*volume, m_status)) {
+  if (readsVolume && !vorl_detail::CheckPixels(vorl_detail::VolumeView(*volume), m_status)) {
     return false;
   }
   if (!vorl_detail::HoldsRows(projectionPlane->GetImage())) {

@@ -219,7 +219,7 @@ bool opVoxelClassification::ClassifyVoxels() {
     m_status.Set(false, "unsupported data type: %d", dataType);
     return false;
   }
-  if (!vorl_detail::CheckPixels(*volume, m_status)) {
+  if (!vorl_detail::CheckPixels(vorl_detail::VolumeView(*volume), m_status)) {
     return false;
   }
   const bool signedValues =
@@ -241,7 +241,7 @@ bool opVoxelClassification::SelectVoxels() {
     m_status.Set(false, "unsupported data type: %d", dataType);
     return false;
   }
-  if (!vorl_detail::CheckPixels(*volume, m_status)) {
+  if (!vorl_detail::CheckPixels(vorl_detail::VolumeView(*volume), m_status)) {
     return false;
   }
   const int classes = 1 << volume->GetDataDepth();

@@ -1,7 +1,6 @@
 #include <vorl/Operators/IP/kernels/SamplingCheck.h>
 
 #include <vorl/Operators/IP/kernels/ImageCheck.h>
-#include <vorl/Operators/IP/kernels/VolumeView.h>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -23,13 +22,17 @@ bool CheckSampling(const dVolume* volume, const dSlice* slice, const char* name,
   return false;
 }
 
-bool CheckSamples(const dVolume& volume, const dSlice& slice, const char* name, dStatus& status) {
+bool CheckSampleType(const dVolume& volume, dStatus& status) {
   const unsigned short dataType = volume.GetDataType();
   if (dataType != ImageDataType_U16 && dataType != ImageDataType_S16) {
     status.Set(false, "unsupported data type: %d", dataType);
     return false;
   }
-  if (!CheckPixels(volume, status)) {
+  return true;
+}
+
+bool CheckSamples(const VolumeView& view, const dSlice& slice, const char* name, dStatus& status) {
+  if (!CheckPixels(view, status)) {
     return false;
   }
   if (!HoldsRows(slice.GetImage())) {

@@ -53,8 +53,8 @@ VolumeView::VolumeView(const dVolume& volume)
   m_slices.push_back(m_slices.back());
 }
 
-bool CheckPixels(const dVolume& volume, dStatus& status) {
-  const auto invalid = VolumeView(volume).FindInvalidSlice();
+bool CheckPixels(const VolumeView& view, dStatus& status) {
+  const auto invalid = view.FindInvalidSlice();
   if (invalid) {
     status.Set(false, "invalid pixel data in slice %d of the Volume", *invalid);
   }

@@ -65,8 +65,8 @@ class VolumeView {
 };
 
 /// False, with the status "invalid pixel data in slice %d of the Volume", when there is such a
-/// slice in the volume, which must not be empty.
-bool CheckPixels(const dVolume& volume, dStatus& status);
+/// slice.
+bool CheckPixels(const VolumeView& view, dStatus& status);
 
 }  // namespace vorl_detail
 }  // namespace vorl
