@@ -143,6 +143,15 @@ TYPED_TEST(SamplingOperator, RefusesAnUnknownAlgorithmBeforeTheDataType) {
   }
 }
 
+TYPED_TEST(SamplingOperator, UnknownAlgorithmsPassThePreparation) {
+  for (const int algo : TypeParam::kNoAlgorithms) {
+    Workbench<TypeParam, rasters::Preparing<typename TypeParam::Op>> bench;
+    bench.op.SelectAlgo(algo);
+    EXPECT_TRUE(bench.op.Prepare());
+    EXPECT_EQ(CodeOf(bench.op), 0);
+  }
+}
+
 TYPED_TEST(SamplingOperator, RefusesEveryOtherDataType) {
   const std::pair<unsigned short, const char*> cases[] = {
       {ImageDataType_U1, "unsupported data type: 1"},
