@@ -137,7 +137,7 @@ TYPED_TEST(SamplingOperator, RefusesAnUnknownAlgorithmBeforeTheDataType) {
     for (const int algo : TypeParam::kNoAlgorithms) {
       typename TestFixture::Bench bench(type);
       bench.op.SelectAlgo(algo);
-      ExpectFailure(bench.op, TypeParam::kRefusal + std::to_string(algo));
+      ExpectFailure(bench.op, std::string(TypeParam::kRefusal) + std::to_string(algo));
       bench.ExpectSliceUnwritten();
     }
   }
