@@ -1,5 +1,6 @@
-// The order of the virtual functions of buffers and strings: applications that were built against
-// an earlier library rely on it.
+// The order of the virtual functions of buffers, strings and text streams: applications that were
+// built against an earlier library rely on it.
+#include <vorl/Data/dASCIIStream.h>
 #include <vorl/Data/dString.h>
 
 #include <gtest/gtest.h>
@@ -16,6 +17,13 @@ TEST(BufferSlots, BufferResetsAndTellsItsValidity) {
   EXPECT_EQ(VirtualSlot(&dBuffer::Release), kReset - 1);
   EXPECT_EQ(VirtualSlot(&dBuffer::Reset), kReset);
   EXPECT_EQ(VirtualSlot(&dBuffer::IsValid), kReset + 1);
+}
+
+TEST(BufferSlots, TextStreamResetsAndTellsItsValidity) {
+  EXPECT_EQ(VirtualSlot(&dASCIIStreamIn::GetClassInfo), 0U);
+  EXPECT_EQ(VirtualSlot(&dASCIIStreamIn::Release), kReset - 1);
+  EXPECT_EQ(VirtualSlot(&dASCIIStreamIn::Reset), kReset);
+  EXPECT_EQ(VirtualSlot(&dASCIIStreamIn::IsValid), kReset + 1);
 }
 
 TEST(BufferSlots, StringAddsItsInitialisationsAndIsEmpty) {

@@ -52,6 +52,61 @@ TEST_F(dASCIIStreamState, ResetLeavesNoPositionToMoveTo) {
   EXPECT_STREQ(stream.GetStatus(), "FillBuffer(): buffer not initialized");
 }
 
+TEST_F(dASCIIStreamState, FailedInitForgetsTheFileBefore) {
+  const std::string missing = m_path + ".missing";
+  dASCIIStreamIn stream;
+  const auto expectEmpty = [&stream] {
+    char ch = '?';
+    EXPECT_FALSE(stream.IsValid());
+    EXPECT_FALSE(stream.GetChar(&ch));
+    EXPECT_FALSE(stream.SetPos(0));
+  };
+  ASSERT_TRUE(stream.Init(m_path.c_str(), 4));
+  EXPECT_FALSE(stream.Init(nullptr));
+  expectEmpty();
+  ASSERT_TRUE(stream.Init(m_path.c_str(), 4));
+  EXPECT_FALSE(stream.Init(m_path.c_str(), 0));
+  expectEmpty();
+  ASSERT_TRUE(stream.Init(m_path.c_str(), 4));
+  EXPECT_FALSE(stream.Init(missing.c_str(), 4));
+  expectEmpty();
+}
+
+TEST_F(dASCIIStreamState, CopiesCarryTheStatusAndResetKeepsIt) {
+  dASCIIStreamIn stream;
+  ASSERT_FALSE(stream.Init(nullptr));
+  dASCIIStreamIn copy(stream);
+  dASCIIStreamIn assigned(m_path.c_str(), 4);
+  assigned = stream;
+  for (dASCIIStreamIn* other : {&copy, &assigned, &stream}) {
+    other->Reset();
+    EXPECT_EQ(static_cast<long>(other->GetStatus()), -1);
+    EXPECT_STREQ(other->GetStatus(), "given string is a 'NULL' pointer");
+  }
+}
+
+TEST_F(dASCIIStreamState, GetCharWhereNothingCouldBeReadIsZero) {
+  dASCIIStreamIn stream(m_path.c_str(), 4);
+  ASSERT_FALSE(stream.SetPos(20));
+  char ch = '?';
+  EXPECT_TRUE(stream.GetChar(&ch));
+  EXPECT_EQ(ch, '\0');
+}
+
+// The file has grown since.
+TEST_F(dASCIIStreamState, ReadingGoesOnFromWhereNothingCouldBeRead) {
+  dASCIIStreamIn stream(m_path.c_str(), 4);
+  ASSERT_FALSE(stream.SetPos(150));
+  char ch = '?';
+  EXPECT_FALSE(stream.NextChar(&ch));
+  Write(std::string(150, '-') + "abcdef");
+  std::string text;
+  for (int i = 0; i < 10 && stream.NextChar(&ch); ++i) {
+    text += ch;
+  }
+  EXPECT_EQ(text, "abcdef");
+}
+
 TEST_F(dASCIIStreamState, GetStringKeepsTheCurrentPosition) {
   dASCIIStreamIn stream(m_path.c_str(), 4);
   char ch = '?';
@@ -76,6 +131,19 @@ TEST_F(dASCIIStreamState, SetPosInsideTheBufferDoesNotReadTheFileAgain) {
   EXPECT_TRUE(stream.SetPos(4));
   EXPECT_TRUE(stream.GetChar(&ch));
   EXPECT_EQ(ch, 'e');
+}
+
+TEST_F(dASCIIStreamState, NextCharReadsTheFileAtEveryEndOfTheBuffer) {
+  dASCIIStreamIn stream(m_path.c_str(), 4);
+  std::string text;
+  for (const char* content : {"abcdefghij", "ABCDEFGHIJ", "klmnopqrst"}) {
+    Write(content);
+    char ch = '?';
+    for (int i = 0; i < 4 && stream.NextChar(&ch); ++i) {
+      text += ch;
+    }
+  }
+  EXPECT_EQ(text, "0123EFGHst");
 }
 
 TEST_F(dASCIIStreamState, SuccessfulInitClearsTheStatus) {

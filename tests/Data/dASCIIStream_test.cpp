@@ -113,9 +113,11 @@ TEST_F(dASCIIStreamFile, GetStringThatEndsAtTheBuffersEndComesFromTheFile) {
 
 TEST_F(dASCIIStreamFile, GetStringBeyondTheEndGivesWhatIsThereAndFails) {
   dASCIIStreamIn stream(m_path.c_str(), 4);
-  char out[16];
+  char out[16] = "###############";
   EXPECT_FALSE(stream.GetString(8, 5, out));
   EXPECT_STREQ(out, "89");
+  EXPECT_FALSE(stream.GetString(10, 3, out));
+  EXPECT_STREQ(out, "");
 }
 
 TEST_F(dASCIIStreamFile, MissingFileIsNamed) {

@@ -129,6 +129,13 @@ class StoppedAtStart : public Op {
   }
 };
 
+/// An operator whose preparation can be asked for alone.
+template <class Op>
+class Preparing : public Op {
+ public:
+  using Op::Prepare;
+};
+
 /// An image that cannot be formatted.
 class StubbornImage : public dImage {
  public:

@@ -8,7 +8,7 @@
 #include <sstream>
 #include <string>
 
-#include "Volumes.h"
+#include "GuardedVolume.h"
 
 namespace rasters {
 
@@ -73,8 +73,9 @@ inline void RandomAxes(dCoordSys3D& system, Random& random) {
   }
 }
 
-/// Fills the volume with up to 14 x 11 x 9 voxels of any kind and places it in space.
-inline void MakeRandomVolume(dVolume& volume, unsigned short type, Random& random) {
+/// Fills the volume with up to 14 x 11 x 9 voxels of any kind, in allocations of just their size,
+/// and places it in space.
+inline void MakeRandomVolume(GuardedVolume& volume, unsigned short type, Random& random) {
   const Format slices = {.width = RandomSize(random, 14),
                          .height = RandomSize(random, 11),
                          .type = type,
@@ -84,6 +85,7 @@ inline void MakeRandomVolume(dVolume& volume, unsigned short type, Random& rando
   for (dSlice& slice : volume.GetSliceList()) {
     SetVoxels(slice.GetImage(), kind, random);
   }
+  volume.Surround(Around::Nothing, false);
   RandomAxes(volume.GetCoordinates(), random);
   volume.GetCoordinates().origin = RandomVector(random);
   volume.GetCoordinates().origin *= random.Between(0, 1) * 100.0;

@@ -6,7 +6,7 @@
 
 #include <array>
 
-#include "Rasters.h"
+#include "GuardedVolume.h"
 
 namespace {
 
@@ -76,17 +76,21 @@ TEST(opLookupModel, AllTypesTablesAndPaddings) {
     dLUT lut;
     MakeRandomTable(lut, source.GetChannelDepth() == 16, random);
     const auto expected = Expected(source, lut);
-    const auto before = rasters::BytesOf(source);
 
-    dImage target;
-    ASSERT_EQ(MessageOf(opLookup(&source, &target, &lut)), "success");
-    ASSERT_EQ(SamplesOf<std::uint8_t>(target), expected);
-    ASSERT_EQ(target.GetRowAlignment(), source.GetRowAlignment());
-    ASSERT_EQ(rasters::BytesOf(source), before);
-
+    rasters::GuardedInput input;
+    for (const rasters::Around around : rasters::kSurroundings) {
+      SCOPED_TRACE(rasters::NameOf(around));
+      input.PutUnder(source, around, true);
+      dImage target;
+      ASSERT_EQ(MessageOf(opLookup(&source, &target, &lut)), "success");
+      ASSERT_EQ(SamplesOf<std::uint8_t>(target), expected);
+      ASSERT_EQ(target.GetRowAlignment(), source.GetRowAlignment());
+      ASSERT_NO_FATAL_FAILURE(input.ExpectUntouched());
+    }
     ASSERT_EQ(MessageOf(opLookup(&source, random.Between(0, 1) != 0 ? &source : nullptr, &lut)),
               "success");
     ASSERT_EQ(SamplesOf<std::uint8_t>(source), expected) << "in place";
+    ASSERT_NO_FATAL_FAILURE(input.ExpectSurroundingsUntouched());
   }
 }
 

@@ -71,7 +71,7 @@ template <class T>
 void CheckHostileLists(unsigned short type, std::uint32_t seed) {
   Random random(seed);
   for (int i = 0; i < 500; ++i) {
-    dVolume volume;
+    rasters::GuardedVolume volume;
     rasters::MakeRandomVolume(volume, type, random);
     dSlice slice;
     GuardedMemory memory;
@@ -91,8 +91,9 @@ void CheckHostileLists(unsigned short type, std::uint32_t seed) {
     ASSERT_TRUE(op.Run());
     ASSERT_EQ(op.GetProgress(), 1.0);
     ASSERT_EQ(rasters::BytesOf(slice.GetImage()), before);
-    memory.ExpectSurroundingsUntouched();
-    list.ExpectUntouched();
+    ASSERT_NO_FATAL_FAILURE(memory.ExpectSurroundingsUntouched());
+    ASSERT_NO_FATAL_FAILURE(list.ExpectUntouched());
+    ASSERT_NO_FATAL_FAILURE(volume.ExpectUntouched());
   }
 }
 

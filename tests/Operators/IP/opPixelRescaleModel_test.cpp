@@ -8,7 +8,7 @@
 #include <cmath>
 #include <limits>
 
-#include "Rasters.h"
+#include "GuardedVolume.h"
 
 namespace {
 
@@ -114,17 +114,22 @@ TEST(opPixelRescaleModel, AllTypesOrdersPaddingsAndExtremeFactors) {
                  << ", alignment " << format.alignment << ", " << factor << ", " << offset);
     dImage source;
     MakeRandom(source, format, random);
-    const Bytes before = BytesOf(source);
     dImage target;
     MakeRandom(target, format, random);
     const Bytes expected = Expected(source, BytesOf(target), factor, offset);
-    ASSERT_EQ(MessageOf(opPixelRescale(&source, &target, factor, offset)), "success");
-    ASSERT_EQ(BytesOf(target), expected);
-    ASSERT_EQ(BytesOf(source), before);
+    rasters::GuardedInput input;
+    for (const rasters::Around around : rasters::kSurroundings) {
+      SCOPED_TRACE(rasters::NameOf(around));
+      input.PutUnder(source, around, false);  // padding is rescaled, too
+      ASSERT_EQ(MessageOf(opPixelRescale(&source, &target, factor, offset)), "success");
+      ASSERT_EQ(BytesOf(target), expected);
+      ASSERT_NO_FATAL_FAILURE(input.ExpectUntouched());
+    }
 
-    const Bytes inPlace = Expected(source, before, factor, offset);
+    const Bytes inPlace = Expected(source, BytesOf(source), factor, offset);
     ASSERT_EQ(MessageOf(opPixelRescale(&source, factor, offset)), "success");
     ASSERT_EQ(BytesOf(source), inPlace);
+    ASSERT_NO_FATAL_FAILURE(input.ExpectSurroundingsUntouched());
   }
 }
 

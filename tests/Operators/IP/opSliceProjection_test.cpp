@@ -129,13 +129,24 @@ TEST(opSliceProjection, NamesWhatIsMissingInItsOrder) {
   }
 }
 
-TEST(opSliceProjection, NeedsASliceForItsProjectionOnly) {
+// They need no slice; the list is looked at when the volume has been.
+TEST(opSliceProjection, NamesWhatIsMissingForTheVolumeInItsOrder) {
   for (const int algo : {302, 303, 304}) {
     Workbench bench;
-    bench.op.SelectAlgo(algo);
-    bench.op.slice = nullptr;
-    bench.op.volume = nullptr;
-    ExpectFailure(bench.op, "no volume to project");
+    opSliceProjection op;
+    op.SelectAlgo(algo);
+    ExpectFailure(op, "missing input parameter 'Projection Slice'");
+    op.projectionPlane = &bench.plane;
+    ExpectFailure(op, "no volume to project");
+    dVolume empty;
+    op.volume = &empty;
+    ExpectFailure(op, "given Volume is empty");
+    Workbench bytes(ImageDataType_U8);
+    op.volume = &bytes.volume;
+    ExpectFailure(op, "incompatible data types(Projection Plane: 0x10, Volume: 0x8");
+    op.volume = &bench.volume;
+    ExpectFailure(op, algo == 303 ? "no voxel list to project"
+                                  : "Z-Buffer is incompatible to 'Projection Plane'");
   }
 }
 
@@ -193,6 +204,17 @@ TEST(opSliceProjection, RefusesUnknownAlgorithmsAndTypesWithOneText) {
     Workbench real(ImageDataType_F32);
     real.op.SelectAlgo(algo);
     ExpectFailure(real.op, "unsupported data type: 8224");
+  }
+}
+
+TEST(opSliceProjection, UnknownAlgorithmsPassThePreparation) {
+  Workbench bench;
+  rasters::Preparing<opSliceProjection> op;
+  static_cast<opSliceProjection&>(op) = bench.op;
+  for (const int algo : {300, 304, 310, 312, 0, -1}) {
+    op.SelectAlgo(algo);
+    EXPECT_TRUE(op.Prepare());
+    EXPECT_EQ(CodeOf(op), 0);
   }
 }
 

@@ -146,6 +146,17 @@ TEST(opVoxelClassification, RefusesUnknownAlgorithmsWhenItComesToThem) {
   }
 }
 
+TEST(opVoxelClassification, UnknownAlgorithmsPassThePreparation) {
+  Workbench bench;
+  rasters::Preparing<opVoxelClassification> op;
+  op.volume = &bench.volume;
+  for (const short algo : std::to_array<short>({404, 399, 0, -1})) {
+    op.SelectAlgo(algo);
+    EXPECT_TRUE(op.Prepare());
+    EXPECT_EQ(CodeOf(op), 0);
+  }
+}
+
 TEST(opVoxelClassification, RefusesEveryOtherDataType) {
   const std::pair<unsigned short, const char*> cases[] = {
       {ImageDataType_U1, "unsupported data type: 1"},
@@ -189,6 +200,21 @@ TEST(opVoxelClassification, FailedClassificationsInvalidateTheOneBefore) {
     bench.op.SelectAlgo(403);
     ExpectFailure(bench.op, "can't select voxels: voxels are not yet classified");
   }
+}
+
+// Nothing has been counted anew, so what was counted before still holds.
+TEST(opVoxelClassification, ClassificationsThatFindNoVolumeKeepTheOneBefore) {
+  Workbench bench;
+  bench.Classify(402);
+  dVolume empty;
+  for (dVolume* volume : {static_cast<dVolume*>(nullptr), &empty}) {
+    bench.op.volume = volume;
+    bench.op.SelectAlgo(401);
+    EXPECT_FALSE(bench.op.Run());
+    EXPECT_EQ(bench.op.classifiedBy, 402);
+  }
+  bench.op.volume = &bench.volume;
+  bench.Select(3);
 }
 
 TEST(opVoxelClassification, RefusesAVolumeWhoseSlicesLostTheirPixels) {

@@ -91,6 +91,16 @@ TEST(opVoxelSelectionLimit, PercentagesAreTruncated) {
   EXPECT_EQ(bench.op.selectionLimit, 0U);  // 0.96
 }
 
+// 0.29 is not exact: 100 of it are less than 29.
+TEST(opVoxelSelectionLimit, PercentagesAreDividedBeforeTheyAreMultiplied) {
+  dVolume volume;
+  rasters::MakeCounting(volume, 10, 10, 1);
+  opVoxelClassification op;
+  op.volume = &volume;
+  op.SetSelectionLimit(29.0);
+  EXPECT_EQ(op.selectionLimit, 28U);
+}
+
 TEST(opVoxelSelectionLimit, PercentagesWithoutAVolumeHaveNoEffect) {
   opVoxelClassification op;
   op.SetSelectionLimit(7);

@@ -96,6 +96,32 @@ TEST(Interrupt, WhileAPlaneIsCutEndsTheRun) {
   EXPECT_TRUE(folder.Names().empty());
 }
 
+// Edges, and many voxels: counting must outlast the pause between two pictures of the bar.
+TEST(Interrupt, WhileVoxelsAreCountedEndsTheRun) {
+  const TestFolder folder;
+  const Outcome outcome =
+      RunTool({"select", "--phantom=400x400x300", "--by", "edge", "-o",
+               (folder / "list.bdf").string(), "--draw", (folder / "list.png").string()},
+              OnceShown("counting the voxels"));
+  EXPECT_EQ(outcome.code, 1);
+  EXPECT_NE(outcome.errors.find("vorl: cancelled"), std::string::npos);
+  EXPECT_TRUE(folder.Names().empty());
+}
+
+TEST(Interrupt, WhileAListIsWrittenLeavesTheEarlierFileOnly) {
+  const TestFolder folder;
+  const std::string path = (folder / "list.bdf").string();
+  WriteBytes(path, "earlier");
+  const Outcome outcome = RunTool({"select", "--phantom=200x200x200", "--limit", "100%", "-o", path,
+                                   "--draw", (folder / "list.png").string()},
+                                  WhileWriting(folder.Path(), SIGINT));
+  EXPECT_EQ(outcome.code, 1);
+  EXPECT_EQ(outcome.output, "");
+  EXPECT_EQ(outcome.errors, "vorl: cancelled\n");
+  EXPECT_EQ(folder.Names(), Names{"list.bdf"});
+  EXPECT_EQ(ReadBytes(path), "earlier");
+}
+
 TEST(Interrupt, ARunThatIsToIgnoreInterruptsGoesOn) {
   const TestFolder folder;
   Conditions conditions = WhileWriting(folder.Path(), SIGINT);
