@@ -114,8 +114,9 @@ class VORL_API GraphicHandler : public InputEventHandler {
   /// Deletes this object. False for null and with an empty list, else true: also for an object that
   /// is not in the list, which is left alone.
   virtual bool DeleteObject(VGObjectView* object);
-  /// Deletes the objects of a type with an ID: `VGType_None` means any type, -1 any ID. An object
-  /// of `VGType_None` counts as one of every type. False when there were none.
+  /// Deletes the objects of a type with an ID, of which -1 means any. An object of `VGType_None`
+  /// counts as one of every type; `VGType_None` itself names such objects alone. False when there
+  /// were none.
   virtual bool DeleteObjects(VGType type, long id);
   /// Deletes all objects; true.
   virtual bool DeleteAll();

@@ -387,7 +387,7 @@ bool GraphicHandler::DeleteObjects(VGType type, long id) {
       return false;
     }
     const VGType own = object.GetObjType();
-    return type == VGType_None || own == type || own == VGType_None;
+    return own == type || own == VGType_None;
   });
 }
 
