@@ -246,6 +246,71 @@ TEST_F(GraphicViewPortHandlers, HandlerIsCapturedWhileItDecides) {
   EXPECT_EQ(seen, &a.probe);
 }
 
+TEST_F(GraphicViewPortHandlers, HandlerThatLeavesHidesNoneBehindIt) {
+  a.atEvent = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kDown), "a:4098/1 b:4098/1 c:4098/1 used");
+  viewPort.StopInteractiveOp(tagPOINT{});
+  b.atEvent = [&] { viewPort.RemoveGraphic(&c); };
+  EXPECT_EQ(Event(kDown), "b:4098/1 used") << "one that is gone is not asked";
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerThatMovesToTheTopIsAskedOnce) {
+  a.atEvent = [&] { viewPort.AddGraphic(&a); };
+  c.atEvent = [&] { viewPort.AddGraphic(&c); };
+  EXPECT_EQ(Event(kDown), "a:4098/1 b:4098/1 c:4098/1 used");
+  EXPECT_EQ(Key(), "b:key256/3/65 a:key256/3/65 c:key256/3/65 refused");
+}
+
+TEST_F(GraphicViewPortHandlers, KeysReachTheOthersWhenAHandlerLeaves) {
+  a.atEvent = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Key(), "a:key256/3/65 b:key256/3/65 c:key256/3/65 refused");
+  EXPECT_EQ(Key(), "b:key256/3/65 c:key256/3/65 refused");
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerMayLeaveWhileItIsGivenTheMap) {
+  a.takesDown = true;
+  Event(kDown);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kMove), "refused");
+  a.probe.atMap = nullptr;
+  viewPort.AddGraphic(&a);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kDown), "b:4098/1 c:4098/1 used");
+  viewPort.StopInteractiveOp(tagPOINT{});
+  viewPort.AddGraphic(&a);
+  EXPECT_EQ(Key(), "b:key256/3/65 c:key256/3/65 refused");
+  a.probe.atMap = nullptr;
+  viewPort.AddGraphic(&a);
+  Event(kDown);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  log.clear();
+  viewPort.DrawActiveObject(nullptr);
+  EXPECT_EQ(log, "");
+  viewPort.AddGraphic(&a);
+  log.clear();
+  viewPort.Draw(nullptr, nullptr, false);
+  EXPECT_EQ(log, "b:draw c:draw ");
+}
+
+TEST_F(GraphicViewPortHandlers, AllLoseTheMapThoughOneLeavesMeanwhile) {
+  Key();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  viewPort.UpdateTransformation();
+  for (const TestHandler* handler : {&a, &b, &c}) {
+    EXPECT_EQ(handler->probe.map, nullptr);
+  }
+}
+
+TEST_F(GraphicViewPortHandlers, DrawingReachesTheOthersWhenAHandlerLeaves) {
+  a.draw = [&](HDC) { viewPort.RemoveGraphic(&a); };
+  log.clear();
+  viewPort.Draw(nullptr, nullptr, false);
+  EXPECT_EQ(log, "a:draw b:draw c:draw ");
+}
+
 TEST_F(GraphicViewPortHandlers, HandlersMayChangeTheListDuringAnEvent) {
   a.atEvent = [&] { viewPort.RemoveGraphic(nullptr); };
   EXPECT_EQ(Event(kDown), "a:4098/1 used") << "the viewport pans";

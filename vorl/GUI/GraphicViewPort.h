@@ -377,6 +377,10 @@ class VORL_API GraphicViewPort {
     HandlerList& operator=(const HandlerList& source);
   };
 
+  /// Handlers may change the list whenever they are called: what offers them something goes through
+  /// a copy, and asks this of each.
+  bool IsShown(const GraphicHandler* handler) const;
+  void TakeMapFromHandlers();  ///< all that are shown lose the transformation
   void OnViewWinChanged();
   Rect2D ScrollRange() const;
   Rect2D WithoutBorders(const Rect2D& view) const;

@@ -84,9 +84,7 @@ bool GraphicViewPort::AddGraphic(GraphicHandler* graphic) {
 void GraphicViewPort::RemoveGraphic(GraphicHandler* graphic) {
   if (graphic == nullptr) {
     m_captured = nullptr;
-    for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-      m_handlers[i]->SetTransformation(nullptr);
-    }
+    TakeMapFromHandlers();
     m_handlers.clear();
     return;
   }
@@ -96,6 +94,20 @@ void GraphicViewPort::RemoveGraphic(GraphicHandler* graphic) {
   if (!m_handlers.empty()) {
     graphic->SetTransformation(nullptr);
     std::erase(m_handlers, graphic);
+  }
+}
+
+bool GraphicViewPort::IsShown(const GraphicHandler* handler) const {
+  return std::find(m_handlers.begin(), m_handlers.end(), handler) != m_handlers.end();
+}
+
+void GraphicViewPort::TakeMapFromHandlers() {
+  // Without a copy, for which there may be no memory when the map is about to go. Where a handler
+  // has left meanwhile, the next one stands in its place; whoever comes again has no map to lose.
+  for (std::size_t i = 0; i < m_handlers.size();) {
+    GraphicHandler* const handler = m_handlers[i];
+    handler->SetTransformation(nullptr);
+    i += i < m_handlers.size() && m_handlers[i] == handler ? 1 : 0;
   }
 }
 
@@ -161,10 +173,15 @@ void GraphicViewPort::Draw(HDC dc, Rect2D* clip, bool clipIsGraphic) {
   // Once for all handlers: the clip rectangle is mapped in place.
   ClipToWindow(dc);
   ClipTo(dc, clip, clipIsGraphic);
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (GraphicHandler* const handler : handlers) {
+    if (!IsShown(handler)) {
+      continue;
+    }
     handler->SetTransformation(&m_trafo);
-    handler->Draw(dc, *this);
+    if (IsShown(handler)) {
+      handler->Draw(dc, *this);
+    }
   }
 }
 
@@ -174,8 +191,11 @@ void GraphicViewPort::DrawActiveObject(HDC dc) {
   }
   SelectClipRgn(dc, nullptr);
   ClipToWindow(dc);
-  m_captured->SetTransformation(&m_trafo);
-  m_captured->DrawActiveObject(dc, *this);
+  GraphicHandler* const handler = m_captured;
+  handler->SetTransformation(&m_trafo);
+  if (m_captured == handler) {
+    handler->DrawActiveObject(dc, *this);
+  }
   SelectClipRgn(dc, nullptr);
 }
 

@@ -66,13 +66,15 @@ bool GraphicViewPort::ProcessMouseEvent(int event, int flags, tagPOINT point) {
 }
 
 bool GraphicViewPort::OfferButtonDown(int event, int flags, const tagPOINT& point) {
-  // By index: a handler may change the list while it has the event.
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (GraphicHandler* const handler : handlers) {
+    if (!IsShown(handler)) {
+      continue;
+    }
     tagPOINT own(point);
     m_captured = handler;
     handler->SetTransformation(&m_trafo);
-    if (handler->ProcessMouseEvent(event, flags, own)) {
+    if (m_captured == handler && handler->ProcessMouseEvent(event, flags, own)) {
       return true;
     }
   }
@@ -81,8 +83,12 @@ bool GraphicViewPort::OfferButtonDown(int event, int flags, const tagPOINT& poin
 }
 
 bool GraphicViewPort::PassToCaptured(int event, int flags, tagPOINT& point) {
-  m_captured->SetTransformation(&m_trafo);
-  const bool used = m_captured->ProcessMouseEvent(event, flags, point);
+  GraphicHandler* const handler = m_captured;
+  handler->SetTransformation(&m_trafo);
+  if (m_captured != handler) {
+    return false;  // one of its objects has removed it
+  }
+  const bool used = handler->ProcessMouseEvent(event, flags, point);
   if (event != MouseEvent_ButtonUp) {
     return used;
   }
@@ -91,10 +97,13 @@ bool GraphicViewPort::PassToCaptured(int event, int flags, tagPOINT& point) {
 }
 
 bool GraphicViewPort::ProcessKeyEvent(int event, int flags, int key) {
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (GraphicHandler* const handler : handlers) {
+    if (!IsShown(handler)) {
+      continue;
+    }
     handler->SetTransformation(&m_trafo);
-    if (handler->ProcessKeyEvent(event, flags, key)) {
+    if (IsShown(handler) && handler->ProcessKeyEvent(event, flags, key)) {
       return true;
     }
   }
