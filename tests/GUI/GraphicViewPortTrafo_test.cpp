@@ -280,6 +280,20 @@ TEST(GraphicViewPortTrafo, AlignmentGoesByTheGraphicWindowsOwnSize) {
   ExpectEdges(window, 0, 0, 20, 20);
 }
 
+TEST(GraphicViewPortTrafo, AlignmentOfMirroredRectanglesGoesByTheirSizes) {
+  // Larger than the area, from the right to the left and from below.
+  OpenViewPort larger(kSquare, Rect2D(150, 160, -30, -20));
+  larger.SetAlignment(5);
+  Rect2D window(larger.GetGraphicWin());
+  EXPECT_TRUE(larger.CorrectPosition(window));
+  ExpectEdges(window, 0, 0, -180, -180);
+  // Smaller than a mirrored area.
+  OpenViewPort smaller(Rect2D(100, 100, 0, 0), Rect2D(20, 20, 70, 70));
+  smaller.SetAlignment(5);
+  window = smaller.GetGraphicWin();
+  EXPECT_FALSE(smaller.CorrectPosition(window));
+}
+
 TEST(GraphicViewPortTrafo, AlignmentSeesTheSizeThatTheLimitsLeave) {
   // 50 units at scale 2; the maximum shows twice the area.
   OpenViewPort viewPort(kSquare, Rect2D(20, 20, 70, 70), kSquare);
@@ -375,10 +389,13 @@ TEST(GraphicViewPortTrafo, GivenRectanglesBecomeTheViewportsOwn) {
   ExpectEdges(viewPort.GetViewWin(), 0, 0, 100, 100);
   EXPECT_EQ(listener.count, 1);
   EXPECT_EQ(listener.last, &viewPort);
-  Rect2D both(0, 0, 300, 200);
+  // Both may be one rectangle: the window that it becomes leaves the view as it was given.
+  Rect2D both(-20, 0, 280, 200);
+  viewPort.SetViewMode(3, 3);
   viewPort.UpdateTransformation(both, both);
-  ExpectEdges(viewPort.GetViewWin(), 0, 0, 300, 200);
-  EXPECT_EQ(viewPort.GetScaleX(), 1.0F);
+  ExpectEdges(viewPort.GetViewWin(), -20, 0, 280, 200);
+  ExpectEdges(both, 115, 90, 145, 110);
+  EXPECT_FLOAT_EQ(viewPort.GetScaleX(), 10.0F);
   viewPort.SetInterface(nullptr);
 }
 
@@ -396,7 +413,7 @@ TEST(GraphicViewPortTrafo, TakesTheMapFromItsHandlers) {
 TEST(GraphicViewPortTrafo, ScaleLimitsAreWidenedToTheGivenScale) {
   OpenViewPort viewPort;
   const auto limits = [&](const Rect2D& window, const Rect2D& view) {
-    viewPort.SetScaleFactors(2, 1, 0.5F, 4, 0.5F, 4);
+    viewPort.SetScaleFactors(2, 0.5F, 0.5F, 4, 0.5F, 4);
     viewPort.CorrectScaleLimits(window, view);
     return std::to_string(viewPort.GetMinScaleX()) + " " + std::to_string(viewPort.GetMaxScaleX()) +
            " " + std::to_string(viewPort.GetMinScaleY()) + " " +
@@ -405,9 +422,9 @@ TEST(GraphicViewPortTrafo, ScaleLimitsAreWidenedToTheGivenScale) {
   EXPECT_EQ(limits(Rect2D(0, 0, 10, 10), Rect2D(0, 0, 20, 20)),
             "0.500000 4.000000 0.500000 4.000000");
   EXPECT_EQ(limits(Rect2D(0, 0, 10, 10), Rect2D(0, 0, 100, 1)),
-            "0.500000 5.000000 0.100000 4.000000");
+            "0.500000 5.000000 0.200000 4.000000");
   EXPECT_EQ(limits(Rect2D(0, 0, 10, 10), Rect2D(0, 0, 5, 80)),
-            "0.250000 4.000000 0.500000 8.000000");
+            "0.250000 4.000000 0.500000 16.000000");
   // The sign counts here.
   EXPECT_EQ(limits(Rect2D(0, 0, -10, 10), Rect2D(0, 0, 20, 20)),
             "-1.000000 4.000000 0.500000 4.000000");
