@@ -133,6 +133,14 @@ inline void ExpectEdges(const Rect2D& rect, float left, float top, float right, 
   EXPECT_FLOAT_EQ(rect.GetBR().y, bottom);
 }
 
+/// The transformation takes the graphic window to this rectangle.
+inline void ExpectMapsWindowTo(const GraphicViewPort& viewPort, float left, float top, float right,
+                               float bottom) {
+  Rect2D mapped;
+  viewPort.GraphicToView(viewPort.GetGraphicWin(), mapped);
+  ExpectEdges(mapped, left, top, right, bottom);
+}
+
 inline void ExpectPoint(const dVect2D& point, float x, float y) {
   EXPECT_FLOAT_EQ(point.x, x);
   EXPECT_FLOAT_EQ(point.y, y);
