@@ -8,22 +8,21 @@
 
 #include <cmath>
 #include <limits>
-#include <memory>
-#include <random>
 
 #include "GestureRules.h"
 #include "GestureTesting.h"
 
 namespace {
 
+using gui_testing::Dice;
 using gui_testing::GestureLayer;
 using gui_testing::GestureScene;
 using gui_testing::Screen;
 
 /// Does anything to a scene.
-class WildUser {
+class WildUser : private Dice {
  public:
-  explicit WildUser(unsigned seed) : m_random(seed) {}
+  explicit WildUser(unsigned seed) : Dice(seed) {}
 
   void Step() {
     switch (Number(0, 9)) {
@@ -64,11 +63,6 @@ class WildUser {
   }
 
  private:
-  int Number(int from, int to) {
-    return from + static_cast<int>(m_random() % static_cast<unsigned>(to - from + 1));
-  }
-  bool Chance(int oneIn) { return Number(1, oneIn) == 1; }
-
   float OddFloat() {
     constexpr float kInf = std::numeric_limits<float>::infinity();
     constexpr float kMax = std::numeric_limits<float>::max();
@@ -218,7 +212,6 @@ class WildUser {
     }
   }
 
-  std::mt19937 m_random;
   GestureScene m_scene;
   Screen m_screen;
 };

@@ -8,7 +8,6 @@
 
 #include <algorithm>
 #include <map>
-#include <random>
 #include <set>
 #include <sstream>
 #include <string>
@@ -20,6 +19,7 @@ namespace {
 
 using gui_testing::Box;
 using gui_testing::BoxOf;
+using gui_testing::Dice;
 using gui_testing::ExpectAtRest;
 using gui_testing::ExpectClose;
 using gui_testing::ExpectViewportInOrder;
@@ -31,9 +31,9 @@ using gui_testing::Screen;
 constexpr int kButtons = MK_LBUTTON | MK_RBUTTON | MK_MBUTTON;
 
 /// A user who drags, clicks, zooms, pans, creates and deletes.
-class GestureUser {
+class GestureUser : private Dice {
  public:
-  explicit GestureUser(unsigned seed) : m_random(seed) { m_screen.Paint(m_scene.viewPort); }
+  explicit GestureUser(unsigned seed) : Dice(seed) { m_screen.Paint(m_scene.viewPort); }
 
   void Step() {
     m_what.str("");
@@ -55,21 +55,12 @@ class GestureUser {
   std::map<std::string, int> seen;
 
  private:
-  // --- chance ---
-
-  int Number(int from, int to) {
-    // Not the standard's distribution, whose numbers differ from one library to the next.
-    return from + static_cast<int>(m_random() % static_cast<unsigned>(to - from + 1));
-  }
-  bool Chance(int oneIn) { return Number(1, oneIn) == 1; }
   GestureLayer& AnyLayer() { return *m_scene.layers[Number(0, 2)]; }
   VGObjectView* AnyObject(const GestureLayer& layer) {
     return layer.objects.empty() ? nullptr
                                  : layer.objects[static_cast<std::size_t>(
                                        Number(0, static_cast<int>(layer.objects.size()) - 1))];
   }
-
-  // --- the mouse ---
 
   void UseMouse() {
     if (m_held == 0) {
@@ -89,8 +80,9 @@ class GestureUser {
       Settle();
     } else {
       const int reach = Chance(10) ? 60 : 6;
-      Send(MouseEvent_Move, std::clamp<LONG>(m_pos.x + Number(-reach, reach), -15, 115),
-           std::clamp<LONG>(m_pos.y + Number(-reach, reach), -15, 95));
+      const LONG x = m_pos.x + Number(-reach, reach);
+      const LONG y = m_pos.y + Number(-reach, reach);
+      Send(MouseEvent_Move, std::clamp<LONG>(x, -15, 115), std::clamp<LONG>(y, -15, 95));
     }
   }
 
@@ -202,8 +194,6 @@ class GestureUser {
     m_scene.sketches.created = 0;
   }
 
-  // --- what is dragged follows the mouse ---
-
   void Follow(GestureLayer* before) {
     m_dragged = nullptr;
     if (before != nullptr && before != m_captured) {
@@ -237,8 +227,6 @@ class GestureUser {
     ExpectClose(box.max, m_start.max.x + dx, m_start.max.y + dy, "goes the mouse's way");
   }
 
-  // --- the screen ---
-
   /// After something else than the mouse has changed the picture.
   void Settle() {
     m_dragged = nullptr;
@@ -261,8 +249,6 @@ class GestureUser {
     EXPECT_EQ(m_scene.viewPort.GetGraphicWin(), window);
     ++seen["pictures compared"];
   }
-
-  // --- everything else that changes ---
 
   void ChangeSomething() {
     switch (Number(0, 4)) {
@@ -365,7 +351,6 @@ class GestureUser {
     }
   }
 
-  std::mt19937 m_random;
   std::ostringstream m_what;
   GestureScene m_scene;
   Screen m_screen;

@@ -16,12 +16,25 @@
 #include <vorl/GUI/VGText.h>
 
 #include <algorithm>
-#include <cstring>
+#include <random>
 #include <vector>
 
 #include "Canvas.h"
 
 namespace gui_testing {
+
+/// Chance that falls alike everywhere, as the standard's distributions do not.
+class Dice {
+ public:
+  explicit Dice(unsigned seed) : m_random(seed) {}
+  int Number(int from, int to) {
+    return from + static_cast<int>(m_random() % static_cast<unsigned>(to - from + 1));
+  }
+  bool Chance(int oneIn) { return Number(1, oneIn) == 1; }
+
+ private:
+  std::mt19937 m_random;
+};
 
 /// A window's pixels, drawn on as an application does: the device context is kept, and comes back
 /// from everything that changes its clip region.
