@@ -250,6 +250,22 @@ TEST(GraphicHandler, RightClickSelectsWithoutDragging) {
   EXPECT_FALSE(view.IsSelected());
 }
 
+TEST(GraphicHandler, ClicksSelectThroughTheVirtualFunction) {
+  class Choosy : public GraphicHandler {
+   public:
+    bool SelectObject(int flags, dVect2D& /*point*/) override {
+      asked.push_back(std::to_string(flags));
+      return false;
+    }
+    Lines asked;
+  };
+  Choosy handler;
+  dVect2D p(5, 5);
+  EXPECT_FALSE(handler.ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, p));
+  EXPECT_FALSE(handler.ProcessMouseEvent(MouseEvent_ButtonDown, MK_RBUTTON | MK_SHIFT, p));
+  EXPECT_EQ(handler.asked, (Lines{"1", "6"}));
+}
+
 TEST(GraphicHandler, WorksWithoutAnInterface) {
   Layer layer;
   layer.handler.SetInterface(nullptr);

@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <string>
 
 #include "ViewPortTesting.h"
@@ -309,6 +310,48 @@ TEST_F(GraphicViewPortHandlers, DrawingReachesTheOthersWhenAHandlerLeaves) {
   log.clear();
   viewPort.Draw(nullptr, nullptr, false);
   EXPECT_EQ(log, "a:draw b:draw c:draw ");
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerThatIsDestroyedLeaves) {
+  auto shown = std::make_unique<TestHandler>("s", log);
+  shown->takesDown = true;
+  shown->active = &a.probe;
+  viewPort.SetGraphic(shown.get());
+  GraphicViewPort copy(viewPort);
+  Event(kDown);
+  copy.ProcessMouseEvent(kDown, kLeft, {50, 60});
+  EXPECT_EQ(copy.GetActiveGraphicObject(), &a.probe);
+  shown.reset();
+  for (GraphicViewPort* left : {static_cast<GraphicViewPort*>(&viewPort), &copy}) {
+    EXPECT_EQ(left->GetActiveGraphicObject(), nullptr);
+    left->DrawActiveObject(nullptr);
+    left->Draw(nullptr, nullptr, false);
+    left->UpdateTransformation();
+    EXPECT_FALSE(left->ProcessKeyEvent(1, 2, 3));
+    EXPECT_TRUE(left->ProcessMouseEvent(kDown, kLeft, {50, 60})) << "it pans now";
+    EXPECT_TRUE(left->ProcessMouseEvent(kUp, 0, {50, 60}));
+  }
+  TrafoST2D map;
+  a.SetTransformation(&map);
+  viewPort.RemoveGraphic(&a);
+  EXPECT_EQ(a.probe.map, &map) << "there are no handlers at all";
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerMayBeDestroyedByWhatItIsOffered) {
+  const auto expectGone = [&](auto&& offer, const std::string& expected) {
+    auto mortal = std::make_unique<TestHandler>("m", log);
+    a.atEvent = [&] { mortal.reset(); };
+    a.draw = [&](HDC) { mortal.reset(); };
+    viewPort.SetGraphic(&a);
+    viewPort.AddGraphic(mortal.get());
+    log.clear();
+    offer();
+    EXPECT_EQ(log, expected);
+    EXPECT_EQ(mortal, nullptr);
+  };
+  expectGone([&] { viewPort.ProcessKeyEvent(1, 2, 3); }, "a:key1/2/3 ");
+  expectGone([&] { viewPort.Draw(nullptr, nullptr, false); }, "a:draw ");
+  expectGone([&] { viewPort.ProcessMouseEvent(kDown, kLeft, {50, 60}); }, "a:4098/1 ");
 }
 
 TEST_F(GraphicViewPortHandlers, HandlersMayChangeTheListDuringAnEvent) {

@@ -53,11 +53,23 @@ GraphicHandler& GraphicHandler::operator=(const GraphicHandler& source) {
 }
 
 GraphicHandler::~GraphicHandler() {
+  m_life.reset();
   m_pInterface = nullptr;
   DeleteWhere([](const VGObjectView&) { return true; });
   for (const Entry& entry : m_list) {
     Unregister(entry.object);  // added meanwhile by the destructor of an object
   }
+}
+
+bool GraphicHandler::StartLife() {
+  try {
+    if (!m_life) {
+      m_life = std::shared_ptr<GraphicHandler>(this, [](GraphicHandler*) {});
+    }
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+  return true;
 }
 
 void GraphicHandler::CopyState(const GraphicHandler& source) {

@@ -13,6 +13,7 @@
 #include <vorl/export.h>
 
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 inline namespace vorl {
@@ -50,8 +51,9 @@ class VORL_API IGraphicViewPort {
 /// them: it sizes the graphic window by the modes and limits, moves it over the graphic area, and
 /// computes the transformation. Where a function calls it itself, that is said.
 ///
-/// *Ownership.* Handlers and the interface belong to the caller, who removes them here before they
-/// go. A copied viewport shares them; without memory the copy shows no handlers.
+/// *Ownership.* Handlers and the interface belong to the caller. A handler that is destroyed leaves
+/// all viewports by itself; the interface is removed before it goes. A copied viewport shares them;
+/// without memory the copy shows no handlers.
 ///
 /// *Errors.* Nothing fails. Degenerate rectangles are absorbed where that is said, and give
 /// infinities or NaN elsewhere; numbers that do not fit the device's integers become the nearest
@@ -276,8 +278,7 @@ class VORL_API GraphicViewPort {
   void UpdateTransformation(Rect2D& window, const Rect2D& view);
 
   /// Shows one handler (null for none) in place of those so far, which keep their transformation. A
-  /// captured one still receives the mouse until the button is up: one that is to go before that is
-  /// removed with `RemoveGraphic`.
+  /// captured one still receives the mouse until the button is up.
   void SetGraphic(GraphicHandler* graphic);
   /// Shows a handler on top of the others; one that is shown already is moved to the top. False for
   /// null and without memory.
@@ -336,18 +337,29 @@ class VORL_API GraphicViewPort {
   bool StopInteractiveOp(const tagPOINT& point);
 
  private:
+  /// A handler; null once it is gone.
+  class HandlerRef {
+   public:
+    HandlerRef() = default;
+    explicit HandlerRef(const GraphicHandler& handler);
+    GraphicHandler* Get() const { return m_life.lock().get(); }
+
+   private:
+    std::weak_ptr<GraphicHandler> m_life;
+  };
   /// The handlers in the order of drawing. A copy for which there is no memory is empty.
-  class HandlerList : public std::vector<GraphicHandler*> {
+  class HandlerList : public std::vector<HandlerRef> {
    public:
     HandlerList();
     HandlerList(const HandlerList& source);
     HandlerList& operator=(const HandlerList& source);
   };
 
-  /// Handlers may change the list whenever they are called: what offers them something goes through
-  /// a copy, and asks this of each.
+  /// Not null, and in the list. Handlers may change that whenever they are called: what offers them
+  /// something goes through a copy of the list, and asks this of each.
   bool IsShown(const GraphicHandler* handler) const;
-  void TakeMapFromHandlers();  ///< all that are shown lose the transformation
+  void Unlist(const GraphicHandler* handler);  ///< and those that are gone
+  void TakeMapFromHandlers();                  ///< all that are shown lose the transformation
   void OnViewWinChanged();
   Rect2D ScrollRange() const;
   Rect2D WithoutBorders(const Rect2D& view) const;
@@ -388,7 +400,7 @@ class VORL_API GraphicViewPort {
   dVect2D m_viewRefPos;
   dVect2D m_graphicRefPos;
   HandlerList m_handlers;
-  GraphicHandler* m_captured = nullptr;
+  HandlerRef m_captured;
   IGraphicViewPort* m_interface = nullptr;
 };
 
