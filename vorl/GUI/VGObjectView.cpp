@@ -1,6 +1,7 @@
 #include <vorl/GUI/VGObjectView.h>
 
 #include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/detail/ObjectWatch.h>
 
 inline namespace vorl {
 
@@ -65,6 +66,7 @@ VGObjectView& VGObjectView::operator=(const VGObjectView& source) {
 }
 
 VGObjectView::~VGObjectView() {
+  Watch::End(m_watch);
   for (GraphicHandler* const handler : m_handlers) {
     handler->Forget(this);
   }
@@ -104,8 +106,9 @@ void VGObjectView::Draw(HDC dc, GraphicViewPort& viewPort) {
   if (!IsVisible()) {
     return;
   }
+  const Watch watch(*this);
   DrawGraphic(dc, viewPort);
-  if (IsSelected()) {
+  if (!watch.IsGone() && IsSelected()) {
     DrawSelection(dc, viewPort);
   }
 }
@@ -114,8 +117,9 @@ void VGObjectView::Draw(HDC dc) {
   if (!IsVisible()) {
     return;
   }
+  const Watch watch(*this);
   DrawGraphic(dc);
-  if (IsSelected()) {
+  if (!watch.IsGone() && IsSelected()) {
     DrawSelection(dc);
   }
 }

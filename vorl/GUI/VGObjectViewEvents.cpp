@@ -2,6 +2,7 @@
 
 #include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/detail/ObjectWatch.h>
 
 inline namespace vorl {
 
@@ -71,7 +72,11 @@ bool VGObjectView::ProcessMouseEvent(int event, int flags, dVect2D& point) {
     return false;
   }
   if (isLeftClick && m_opState == VGOperation_None) {
+    const Watch watch(*this);
     const short grabbed = GetSelectionState(flags, point);
+    if (watch.IsGone()) {
+      return false;
+    }
     if (IsEnabled(grabbed)) {
       SetOpState(grabbed);
     } else if (IsEnabled(VGOperation_Move)) {
@@ -93,23 +98,21 @@ bool VGObjectView::Dispatch(int event, int flags, dVect2D& point) {
   if (handlers == nullptr) {
     return false;
   }
+  const Watch watch(*this);
+  const bool isDown = event == MouseEvent_ButtonDown;
+  const bool isMove = event == MouseEvent_Move;
+  const bool result = (this->*(isDown   ? handlers->begin
+                               : isMove ? handlers->proceed
+                                        : handlers->end))(point);
+  if (watch.IsGone() || m_pInterface == nullptr) {
+    return result;
+  }
   // The interface is told last: its client may destroy the object.
-  if (event == MouseEvent_ButtonDown) {
-    const bool result = (this->*handlers->begin)(point);
-    if (m_pInterface != nullptr) {
-      m_pInterface->OnBeginGraphicOp(this, operation);
-    }
-    return result;
-  }
-  if (event == MouseEvent_Move) {
-    const bool result = (this->*handlers->proceed)(point);
-    if (m_pInterface != nullptr) {
-      m_pInterface->OnGraphicChanged(this, operation);
-    }
-    return result;
-  }
-  const bool result = (this->*handlers->end)(point);
-  if (m_pInterface != nullptr) {
+  if (isDown) {
+    m_pInterface->OnBeginGraphicOp(this, operation);
+  } else if (isMove) {
+    m_pInterface->OnGraphicChanged(this, operation);
+  } else {
     m_pInterface->OnEndGraphicOp(this, operation);
   }
   return result;
