@@ -33,6 +33,7 @@
 #include <vorl/GUI/Geom2D.h>
 #include <vorl/GUI/GraphicHandler.h>
 #include <vorl/GUI/GraphicViewPort.h>
+#include <vorl/GUI/GraphicViewPortModes.h>
 #include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>

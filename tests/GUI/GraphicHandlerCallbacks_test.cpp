@@ -2,6 +2,7 @@
 // checker.
 
 #include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/GraphicViewPort.h>
 
 #include <gtest/gtest.h>
 
@@ -188,6 +189,88 @@ TEST_F(GraphicHandlerCallbacks, ObjectDeletedByItsFirstClickIsNotReported) {
   EXPECT_TRUE(layer.Down(5, 5));
   EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "new: to view", "new: move (5, 5)",
                                  "OnBeginGraphicOp 99 8", "OnDeleteObject 99", "new: end"}));
+}
+
+/// Has itself deleted when it is called for the given time, and counts the calls.
+class SelfDeleting : public gui_testing::BareView {
+ public:
+  SelfDeleting(GraphicHandler& handler, int calls) : m_handler(handler), m_calls(calls) {
+    SetDynamicCreationFlag();
+    SetViewState(VGViewState_Visible);
+    Enable(VGOperation_Select | VGOperation_Move);
+    m_handler.AddObject(this);
+  }
+  using VGObjectView::Draw;
+  using VGObjectView::DrawGraphic;
+  using VGObjectView::DrawSelection;
+  using VGObjectView::GetSelectionState;
+  short GetSelectionState(int /*flags*/, dVect2D& /*p*/) override {
+    Live();
+    return VGOperation_Move;
+  }
+  bool OnBeginMove(dVect2D& /*p*/) override { return Live(); }
+  bool OnMove(dVect2D& /*p*/) override { return Live(); }
+  bool OnEndMove(dVect2D& /*p*/) override { return Live(); }
+  void DrawGraphic(HDC /*dc*/) override { Live(); }
+  void DrawSelection(HDC /*dc*/) override { Live(); }
+
+ private:
+  bool Live() { return --m_calls != 0 || m_handler.DeleteObject(this); }
+
+  GraphicHandler& m_handler;
+  int m_calls;
+};
+
+TEST(GraphicHandlerSelfDeletion, ObjectMayDeleteItselfWhateverItIsCalledFor) {
+  // Selecting asks once, and the click once more before the move begins.
+  const char* const told[] = {"",
+                              "OnSelectObject null",
+                              "OnSelectObject null",
+                              "OnSelectObject null",
+                              "OnBeginGraphicOp 7 8|OnSelectObject 7",
+                              "OnBeginGraphicOp 7 8|OnSelectObject 7|OnGraphicChanged 7 8|"
+                              "OnModifyObject 7"};
+  for (int calls = 1; calls <= 5; ++calls) {
+    Lines lines;
+    gui_testing::RecordingClient client(lines);
+    gui_testing::RecordingViewClient viewClient(lines);
+    GraphicHandler handler;
+    auto* const object = new SelfDeleting(handler, calls);
+    object->SetUserData(7);
+    object->SetInterface(&viewClient);
+    handler.SetInterface(&client);
+    dVect2D p(1, 1);
+    const int events[] = {MouseEvent_ButtonDown, MouseEvent_Move, MouseEvent_ButtonUp};
+    for (const int event : events) {
+      handler.ProcessMouseEvent(event, MK_LBUTTON, p);
+    }
+    std::string all;
+    for (const std::string& line : lines) {
+      if (line != "OnDeleteObject 7") {
+        all += (all.empty() ? "" : "|") + line;
+      }
+    }
+    EXPECT_EQ(all, told[calls]) << "in call " << calls;
+    EXPECT_EQ(handler.GetObjectByUserData(7), nullptr) << "in call " << calls;
+  }
+}
+
+TEST(GraphicHandlerSelfDeletion, ObjectMayDeleteItselfWhileItIsDrawn) {
+  GraphicViewPort viewPort;
+  for (const bool isInViewPort : {false, true}) {
+    for (int calls = 1; calls <= 2; ++calls) {
+      GraphicHandler handler;
+      auto* const object = new SelfDeleting(handler, calls);
+      object->SetUserData(7);
+      object->Select(true);
+      if (isInViewPort) {
+        handler.Draw(nullptr, viewPort);
+      } else {
+        handler.Draw(nullptr);
+      }
+      EXPECT_EQ(handler.GetObjectByUserData(7), nullptr) << "in call " << calls;
+    }
+  }
 }
 
 }  // namespace

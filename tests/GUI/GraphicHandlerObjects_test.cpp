@@ -204,11 +204,11 @@ TEST_F(GraphicHandlerDeleteObjects, ObjectWithoutTypeIsOfEveryType) {
   EXPECT_FALSE(layer.handler.DeleteObjects(VGType_Curve, 6));
 }
 
-TEST_F(GraphicHandlerDeleteObjects, NoTypeMeansAnyType) {
-  EXPECT_TRUE(layer.handler.DeleteObjects(VGType_None, 5));
-  EXPECT_EQ(Rest(layer.handler), "24");
+TEST_F(GraphicHandlerDeleteObjects, NoTypeNamesOnlyObjectsWithoutOne) {
+  EXPECT_FALSE(layer.handler.DeleteObjects(VGType_None, 5));
+  EXPECT_EQ(Rest(layer.handler), "1234");
   EXPECT_TRUE(layer.handler.DeleteObjects(VGType_None, -1));
-  EXPECT_EQ(Rest(layer.handler), "");
+  EXPECT_EQ(Rest(layer.handler), "123");
 }
 
 TEST_F(GraphicHandlerDeleteObjects, UnknownIdDeletesNothing) {

@@ -1,4 +1,4 @@
-// Drawing, hitting, selecting, creating and dragging through a handler.
+// Drawing, hitting, selecting and dragging through a handler.
 
 #include <vorl/GUI/GraphicHandler.h>
 #include <vorl/GUI/GraphicViewPort.h>
@@ -250,6 +250,22 @@ TEST(GraphicHandler, RightClickSelectsWithoutDragging) {
   EXPECT_FALSE(view.IsSelected());
 }
 
+TEST(GraphicHandler, ClicksSelectThroughTheVirtualFunction) {
+  class Choosy : public GraphicHandler {
+   public:
+    bool SelectObject(int flags, dVect2D& /*point*/) override {
+      asked.push_back(std::to_string(flags));
+      return false;
+    }
+    Lines asked;
+  };
+  Choosy handler;
+  dVect2D p(5, 5);
+  EXPECT_FALSE(handler.ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, p));
+  EXPECT_FALSE(handler.ProcessMouseEvent(MouseEvent_ButtonDown, MK_RBUTTON | MK_SHIFT, p));
+  EXPECT_EQ(handler.asked, (Lines{"1", "6"}));
+}
+
 TEST(GraphicHandler, WorksWithoutAnInterface) {
   Layer layer;
   layer.handler.SetInterface(nullptr);
@@ -262,88 +278,6 @@ TEST(GraphicHandler, WorksWithoutAnInterface) {
   layer.handler.SetCreateMode(VGType_Line, -1);
   EXPECT_TRUE(layer.Down(50, 5));
   EXPECT_TRUE(layer.handler.DeleteAll());
-}
-
-TEST(GraphicHandler, ClickOnNothingCreatesOneObject) {
-  Layer layer;
-  layer.handler.SetCreateMode(VGType_Line, 42);
-  EXPECT_TRUE(layer.Down(30, 40));
-  EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "new: to view", "new: create 4098 1 (30, 40)",
-                                 "OnCreateObject 99"}));
-  VGObjectView* const object = layer.handler.GetObject(42);
-  ASSERT_NE(object, nullptr);
-  EXPECT_EQ(layer.handler.GetActiveObject(), object);
-  EXPECT_TRUE(object->IsEnabled(0x3F));
-  EXPECT_TRUE(object->IsSelected());
-  EXPECT_TRUE(object->IsVisible());
-  EXPECT_EQ(object->GetOpState(), 1);
-  EXPECT_TRUE(layer.Move(31, 41));
-  EXPECT_EQ(layer.Take(), (Lines{"new: create 4097 1 (31, 41)", "OnModifyObject 99"}));
-  EXPECT_TRUE(layer.Up(32, 42));
-  EXPECT_EQ(layer.Take(), (Lines{"new: create 4099 1 (32, 42)", "OnObjectModified 99"}));
-  static_cast<RecordingView*>(object)->answer = false;  // has no use for further events
-  EXPECT_FALSE(layer.Down(80, 80));
-  EXPECT_EQ(layer.Take(), (Lines{"new: create 4098 1 (80, 80)", "OnSelectObject null"}))
-      << "one click creates one object";
-}
-
-TEST(GraphicHandler, CreateIdIsForOneObject) {
-  Layer layer;
-  layer.handler.SetCreateMode(VGType_Line, 42);
-  layer.Down(30, 40);
-  VGObjectView* const first = layer.handler.GetActiveObject();
-  ASSERT_NE(first, nullptr);
-  layer.handler.DeleteActive();
-  layer.handler.SetCreateMode(VGType_Rect, -1);
-  layer.Down(70, 70);
-  VGObjectView* const second = layer.handler.GetActiveObject();
-  ASSERT_NE(second, nullptr);
-  EXPECT_EQ(second->GetObjID(), static_cast<long>(reinterpret_cast<std::uintptr_t>(second)));
-}
-
-TEST(GraphicHandler, ClickOnAnObjectLeavesCreationPending) {
-  Layer layer;
-  layer.Add(1, 0, 0);
-  layer.handler.SetCreateMode(VGType_Line, -1);
-  EXPECT_TRUE(layer.Down(5, 5));
-  EXPECT_EQ(layer.Take(), (Lines{"1: move (5, 5)", "OnSelectObject 1"}));
-  layer.Up(5, 5);
-  layer.Take();
-  EXPECT_TRUE(layer.Down(50, 50));
-  EXPECT_EQ(layer.Take().front(), "CreateObject 2");
-}
-
-TEST(GraphicHandler, CreationThatFailsSelectsNothing) {
-  Layer layer;
-  layer.handler.createsNothing = true;
-  layer.handler.SetCreateMode(VGType_Line, 42);
-  EXPECT_FALSE(layer.Down(30, 40));
-  EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "OnSelectObject null"}));
-  EXPECT_FALSE(layer.Down(30, 40));
-  EXPECT_EQ(layer.Take(), Lines{"OnSelectObject null"}) << "the create mode is used up";
-  layer.handler.createsNothing = false;
-  layer.handler.SetCreateMode(VGType_Line, -1);
-  layer.Down(30, 40);
-  EXPECT_EQ(layer.handler.GetObject(42), nullptr);
-}
-
-TEST(GraphicHandler, CreatedObjectThatIsNotListedIsDestroyed) {
-  Layer layer;
-  layer.handler.acceptsObjects = false;
-  layer.handler.SetCreateMode(VGType_Line, -1);
-  EXPECT_FALSE(layer.Down(30, 40));
-  EXPECT_EQ(layer.Take(), (Lines{"CreateObject 2", "new: end", "OnSelectObject null"}));
-  EXPECT_EQ(layer.handler.GetActiveObject(), nullptr);
-}
-
-TEST(GraphicHandler, CreatedObjectGetsTheTransformationBeforeTheClick) {
-  Layer layer;
-  Translate2D trafo(1, 2);
-  layer.handler.SetTransformation(&trafo);
-  layer.handler.SetCreateMode(VGType_Line, -1);
-  layer.Down(30, 40);
-  ASSERT_NE(layer.handler.GetActiveObject(), nullptr);
-  EXPECT_EQ(layer.handler.GetActiveObject()->GetTransformation(), &trafo);
 }
 
 TEST(GraphicHandler, TransformationGoesToAllObjectsOnce) {

@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <string>
 
 #include "ViewPortTesting.h"
@@ -244,6 +245,113 @@ TEST_F(GraphicViewPortHandlers, HandlerIsCapturedWhileItDecides) {
   a.atEvent = [&] { seen = viewPort.GetActiveGraphicObject(); };
   Event(kDown);
   EXPECT_EQ(seen, &a.probe);
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerThatLeavesHidesNoneBehindIt) {
+  a.atEvent = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kDown), "a:4098/1 b:4098/1 c:4098/1 used");
+  viewPort.StopInteractiveOp(tagPOINT{});
+  b.atEvent = [&] { viewPort.RemoveGraphic(&c); };
+  EXPECT_EQ(Event(kDown), "b:4098/1 used") << "one that is gone is not asked";
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerThatMovesToTheTopIsAskedOnce) {
+  a.atEvent = [&] { viewPort.AddGraphic(&a); };
+  c.atEvent = [&] { viewPort.AddGraphic(&c); };
+  EXPECT_EQ(Event(kDown), "a:4098/1 b:4098/1 c:4098/1 used");
+  EXPECT_EQ(Key(), "b:key256/3/65 a:key256/3/65 c:key256/3/65 refused");
+}
+
+TEST_F(GraphicViewPortHandlers, KeysReachTheOthersWhenAHandlerLeaves) {
+  a.atEvent = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Key(), "a:key256/3/65 b:key256/3/65 c:key256/3/65 refused");
+  EXPECT_EQ(Key(), "b:key256/3/65 c:key256/3/65 refused");
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerMayLeaveWhileItIsGivenTheMap) {
+  a.takesDown = true;
+  Event(kDown);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kMove), "refused");
+  a.probe.atMap = nullptr;
+  viewPort.AddGraphic(&a);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  EXPECT_EQ(Event(kDown), "b:4098/1 c:4098/1 used");
+  viewPort.StopInteractiveOp(tagPOINT{});
+  viewPort.AddGraphic(&a);
+  EXPECT_EQ(Key(), "b:key256/3/65 c:key256/3/65 refused");
+  a.probe.atMap = nullptr;
+  viewPort.AddGraphic(&a);
+  Event(kDown);
+  viewPort.UpdateTransformation();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  log.clear();
+  viewPort.DrawActiveObject(nullptr);
+  EXPECT_EQ(log, "");
+  viewPort.AddGraphic(&a);
+  log.clear();
+  viewPort.Draw(nullptr, nullptr, false);
+  EXPECT_EQ(log, "b:draw c:draw ");
+}
+
+TEST_F(GraphicViewPortHandlers, AllLoseTheMapThoughOneLeavesMeanwhile) {
+  Key();
+  a.probe.atMap = [&] { viewPort.RemoveGraphic(&a); };
+  viewPort.UpdateTransformation();
+  for (const TestHandler* handler : {&a, &b, &c}) {
+    EXPECT_EQ(handler->probe.map, nullptr);
+  }
+}
+
+TEST_F(GraphicViewPortHandlers, DrawingReachesTheOthersWhenAHandlerLeaves) {
+  a.draw = [&](HDC) { viewPort.RemoveGraphic(&a); };
+  log.clear();
+  viewPort.Draw(nullptr, nullptr, false);
+  EXPECT_EQ(log, "a:draw b:draw c:draw ");
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerThatIsDestroyedLeaves) {
+  auto shown = std::make_unique<TestHandler>("s", log);
+  shown->takesDown = true;
+  shown->active = &a.probe;
+  viewPort.SetGraphic(shown.get());
+  GraphicViewPort copy(viewPort);
+  Event(kDown);
+  copy.ProcessMouseEvent(kDown, kLeft, {50, 60});
+  EXPECT_EQ(copy.GetActiveGraphicObject(), &a.probe);
+  shown.reset();
+  for (GraphicViewPort* left : {static_cast<GraphicViewPort*>(&viewPort), &copy}) {
+    EXPECT_EQ(left->GetActiveGraphicObject(), nullptr);
+    left->DrawActiveObject(nullptr);
+    left->Draw(nullptr, nullptr, false);
+    left->UpdateTransformation();
+    EXPECT_FALSE(left->ProcessKeyEvent(1, 2, 3));
+    EXPECT_TRUE(left->ProcessMouseEvent(kDown, kLeft, {50, 60})) << "it pans now";
+    EXPECT_TRUE(left->ProcessMouseEvent(kUp, 0, {50, 60}));
+  }
+  TrafoST2D map;
+  a.SetTransformation(&map);
+  viewPort.RemoveGraphic(&a);
+  EXPECT_EQ(a.probe.map, &map) << "there are no handlers at all";
+}
+
+TEST_F(GraphicViewPortHandlers, HandlerMayBeDestroyedByWhatItIsOffered) {
+  const auto expectGone = [&](auto&& offer, const std::string& expected) {
+    auto mortal = std::make_unique<TestHandler>("m", log);
+    a.atEvent = [&] { mortal.reset(); };
+    a.draw = [&](HDC) { mortal.reset(); };
+    viewPort.SetGraphic(&a);
+    viewPort.AddGraphic(mortal.get());
+    log.clear();
+    offer();
+    EXPECT_EQ(log, expected);
+    EXPECT_EQ(mortal, nullptr);
+  };
+  expectGone([&] { viewPort.ProcessKeyEvent(1, 2, 3); }, "a:key1/2/3 ");
+  expectGone([&] { viewPort.Draw(nullptr, nullptr, false); }, "a:draw ");
+  expectGone([&] { viewPort.ProcessMouseEvent(kDown, kLeft, {50, 60}); }, "a:4098/1 ");
 }
 
 TEST_F(GraphicViewPortHandlers, HandlersMayChangeTheListDuringAnEvent) {

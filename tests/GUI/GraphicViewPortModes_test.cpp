@@ -26,7 +26,7 @@ TEST(GraphicViewPortModes, ScaleFactorsAreStoredInTheirOrder) {
 }
 
 TEST(GraphicViewPortModes, SizesAreScalesOfTheGraphicArea) {
-  GraphicViewPort viewPort(Rect2D(0, 0, 50, 20));
+  GraphicViewPort viewPort(Rect2D(0, 0, 50, 20), Rect2D(0, 0, 7, 8));
   viewPort.SetScaleSizes(100, 60, 25, 400, 30, 180);
   EXPECT_EQ(viewPort.GetOrigSizeScaleX(), 2.0);
   EXPECT_EQ(viewPort.GetOrigSizeScaleY(), 3.0);

@@ -24,6 +24,20 @@ inline std::string Text(const dVect2D& p) {
   return out.str();
 }
 
+/// Overrides no more than it must.
+class BareView : public VGObjectView {
+ public:
+  VGType GetObjType() override { return VGType_None; }
+  void Transform(bool toGraphic) override { (toGraphic ? written : refreshed) += 1; }
+  void CalcBoundingBox(HDC /*dc*/, dVect2D& /*min*/, dVect2D& /*max*/) override {}
+  using VGObjectView::AssignViewState;
+  using VGObjectView::GetHandleDistance;
+  using VGObjectView::GetLineDistance;
+  using VGObjectView::SetOpState;
+  int refreshed = 0;
+  int written = 0;
+};
+
 /// A square that is grabbed anywhere inside. It ends its operations itself, as shapes do.
 class RecordingView : public VGObjectView {
  public:

@@ -2,6 +2,7 @@
 #include <gtest/gtest.h>
 #include <tests/Support/Allocation.h>
 #include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/GraphicViewPort.h>
 #include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGPoint.h>
 #include <vorl/GUI/VGText.h>
@@ -52,6 +53,20 @@ TEST(GraphicsOutOfMemory, CopyIsEmpty) {
   EXPECT_EQ(handler.GetObject(5), &object);
   target = handler;
   EXPECT_EQ(target.GetObject(5), &object);
+}
+
+TEST(GraphicsOutOfMemory, LayerCannotBeShown) {
+  GraphicHandler handler;
+  GraphicViewPort viewPort;
+  {
+    const AllocationFailure failure;
+    EXPECT_FALSE(viewPort.AddGraphic(&handler));
+  }
+  EXPECT_TRUE(viewPort.AddGraphic(&handler));
+  {
+    const AllocationFailure failure;
+    EXPECT_TRUE(viewPort.AddGraphic(&handler)) << "it is moved only";
+  }
 }
 
 /// Creates its object beforehand.

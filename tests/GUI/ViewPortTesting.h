@@ -50,10 +50,14 @@ class MapProbe : public VGObjectView {
  public:
   Trafo2DBase* map = nullptr;
   int given = 0;
+  std::function<void()> atMap;
   VGType GetObjType() override { return VGType_None; }
   void SetTransformation(Trafo2DBase* trafo) override {
     map = trafo;
     ++given;
+    if (atMap) {
+      atMap();
+    }
   }
   void Transform(bool) override {}
   void CalcBoundingBox(HDC, dVect2D&, dVect2D&) override {}
@@ -98,6 +102,9 @@ class TestHandler : public GraphicHandler {
     m_log += name + ":key" + std::to_string(event) + "/" + std::to_string(flags) + "/" +
              std::to_string(key) + " ";
     mapAtEvent = probe.map;
+    if (atEvent) {
+      atEvent();
+    }
     return takesKeys;
   }
   void Draw(HDC dc, GraphicViewPort& viewPort) override { DrawOn(dc, viewPort, ":draw "); }
@@ -124,6 +131,14 @@ inline void ExpectEdges(const Rect2D& rect, float left, float top, float right, 
   EXPECT_FLOAT_EQ(rect.GetTL().y, top);
   EXPECT_FLOAT_EQ(rect.GetBR().x, right);
   EXPECT_FLOAT_EQ(rect.GetBR().y, bottom);
+}
+
+/// The transformation takes the graphic window to this rectangle.
+inline void ExpectMapsWindowTo(const GraphicViewPort& viewPort, float left, float top, float right,
+                               float bottom) {
+  Rect2D mapped;
+  viewPort.GraphicToView(viewPort.GetGraphicWin(), mapped);
+  ExpectEdges(mapped, left, top, right, bottom);
 }
 
 inline void ExpectPoint(const dVect2D& point, float x, float y) {

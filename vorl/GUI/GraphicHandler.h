@@ -13,6 +13,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 inline namespace vorl {
@@ -114,8 +115,9 @@ class VORL_API GraphicHandler : public InputEventHandler {
   /// Deletes this object. False for null and with an empty list, else true: also for an object that
   /// is not in the list, which is left alone.
   virtual bool DeleteObject(VGObjectView* object);
-  /// Deletes the objects of a type with an ID: `VGType_None` means any type, -1 any ID. An object
-  /// of `VGType_None` counts as one of every type. False when there were none.
+  /// Deletes the objects of a type with an ID, of which -1 means any. An object of `VGType_None`
+  /// counts as one of every type; `VGType_None` itself names such objects alone. False when there
+  /// were none.
   virtual bool DeleteObjects(VGType type, long id);
   /// Deletes all objects; true.
   virtual bool DeleteAll();
@@ -169,6 +171,7 @@ class VORL_API GraphicHandler : public InputEventHandler {
   void SelectUnitY(int unit);
 
  private:
+  friend class GraphicViewPort;
   friend class VGObjectView;
 
   /// A place in the list. One whose object is deleted during a walk is empty until it ends.
@@ -200,6 +203,8 @@ class VORL_API GraphicHandler : public InputEventHandler {
   bool CopyList(const GraphicHandler& source);
   bool Register(VGObjectView* object);
   void Unregister(VGObjectView* object);
+  /// For those who want to know when this handler goes. False without memory.
+  bool StartLife();
   /// An object is gone, by whatever hand.
   void Forget(VGObjectView* object);
 
@@ -212,9 +217,10 @@ class VORL_API GraphicHandler : public InputEventHandler {
   UnitTrafo m_unitTrafoX;
   UnitTrafo m_unitTrafoY;
   IGraphicHandler* m_pInterface = nullptr;
-  std::size_t m_walks = 0;              ///< walks through the list that are under way
-  bool m_mayRepeat = false;             ///< some object was listed more than once
-  std::vector<VGObjectView*> m_doomed;  ///< those that are just being destroyed, by this handler
+  std::size_t m_walks = 0;                 ///< walks through the list that are under way
+  bool m_mayRepeat = false;                ///< some object was listed more than once
+  std::vector<VGObjectView*> m_doomed;     ///< those that are just being destroyed, by this handler
+  std::shared_ptr<GraphicHandler> m_life;  ///< owns nothing; viewports see by it that this is there
 };
 
 }  // namespace vorl

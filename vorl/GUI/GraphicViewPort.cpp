@@ -70,7 +70,7 @@ GraphicViewPort::~GraphicViewPort() {
 }
 
 void GraphicViewPort::Reset() {
-  m_captured = nullptr;
+  m_captured = HandlerRef();
   m_viewWin.Set(0.0F, 0.0F, 100.0F, 100.0F);
   m_graphicWin = m_viewWin;
   m_graphicArea = m_viewWin;

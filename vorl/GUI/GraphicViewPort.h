@@ -6,12 +6,14 @@
 /// and scrolling it, and drawing what it shows.
 
 #include <vorl/Data/dVect2D.h>
+#include <vorl/GUI/GraphicViewPortModes.h>
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo2D.h>
 #include <vorl/Platform/Gdi.h>
 #include <vorl/export.h>
 
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 inline namespace vorl {
@@ -19,40 +21,6 @@ inline namespace vorl {
 class GraphicHandler;
 class GraphicViewPort;
 class VGObjectView;
-
-/// How one direction of a viewport is sized when its transformation is computed.
-enum ViewMode : unsigned char {
-  ViewMode_Free = 0,      ///< keeps its scale
-  ViewMode_Fit = 1,       ///< shows the whole graphic area
-  ViewMode_Original = 2,  ///< scale 1
-  ViewMode_Maximum = 3,   ///< the maximum scale
-  ViewMode_Minimum = 4    ///< the minimum scale
-};
-
-/// Where the graphic area stands when the viewport shows more than it: one rule for each direction.
-enum ViewAlignment : unsigned char {
-  ViewAlignment_None = 0,
-  ViewAlignment_Top = 1,
-  ViewAlignment_Bottom = 2,
-  ViewAlignment_CenterY = 3,
-  ViewAlignment_Left = 4,
-  ViewAlignment_Right = 8,
-  ViewAlignment_CenterX = 12
-};
-
-/// The switches of a viewport.
-enum ViewPortFlag : short {
-  ViewPortFlag_Visible = 0x0001,
-  ViewPortFlag_Proportional = 0x0002,      ///< x and y keep one scale
-  ViewPortFlag_ClipBorders = 0x0004,       ///< drawing is clipped to the draw window
-  ViewPortFlag_FixedGraphicArea = 0x0008,  ///< the scroll range is the graphic area alone
-  ViewPortFlag_ScaleX = 0x0100,            ///< what the mouse may do
-  ViewPortFlag_ScaleY = 0x0200,
-  ViewPortFlag_PanX = 0x0400,
-  ViewPortFlag_PanY = 0x0800,
-  ViewPortFlag_MoveX = 0x1000,
-  ViewPortFlag_MoveY = 0x2000
-};
 
 /// Tells an application what happens to a viewport.
 class VORL_API IGraphicViewPort {
@@ -83,8 +51,9 @@ class VORL_API IGraphicViewPort {
 /// them: it sizes the graphic window by the modes and limits, moves it over the graphic area, and
 /// computes the transformation. Where a function calls it itself, that is said.
 ///
-/// *Ownership.* Handlers and the interface belong to the caller, who removes them here before they
-/// go. A copied viewport shares them; without memory the copy shows no handlers.
+/// *Ownership.* Handlers and the interface belong to the caller. A handler that is destroyed leaves
+/// all viewports by itself; the interface is removed before it goes. A copied viewport shares them;
+/// without memory the copy shows no handlers.
 ///
 /// *Errors.* Nothing fails. Degenerate rectangles are absorbed where that is said, and give
 /// infinities or NaN elsewhere; numbers that do not fit the device's integers become the nearest
@@ -309,8 +278,7 @@ class VORL_API GraphicViewPort {
   void UpdateTransformation(Rect2D& window, const Rect2D& view);
 
   /// Shows one handler (null for none) in place of those so far, which keep their transformation. A
-  /// captured one still receives the mouse until the button is up: one that is to go before that is
-  /// removed with `RemoveGraphic`.
+  /// captured one still receives the mouse until the button is up.
   void SetGraphic(GraphicHandler* graphic);
   /// Shows a handler on top of the others; one that is shown already is moved to the top. False for
   /// null and without memory.
@@ -369,14 +337,29 @@ class VORL_API GraphicViewPort {
   bool StopInteractiveOp(const tagPOINT& point);
 
  private:
+  /// A handler; null once it is gone.
+  class HandlerRef {
+   public:
+    HandlerRef() = default;
+    explicit HandlerRef(const GraphicHandler& handler);
+    GraphicHandler* Get() const { return m_life.lock().get(); }
+
+   private:
+    std::weak_ptr<GraphicHandler> m_life;
+  };
   /// The handlers in the order of drawing. A copy for which there is no memory is empty.
-  class HandlerList : public std::vector<GraphicHandler*> {
+  class HandlerList : public std::vector<HandlerRef> {
    public:
     HandlerList();
     HandlerList(const HandlerList& source);
     HandlerList& operator=(const HandlerList& source);
   };
 
+  /// Not null, and in the list. Handlers may change that whenever they are called: what offers them
+  /// something goes through a copy of the list, and asks this of each.
+  bool IsShown(const GraphicHandler* handler) const;
+  void Unlist(const GraphicHandler* handler);  ///< and those that are gone
+  void TakeMapFromHandlers();                  ///< all that are shown lose the transformation
   void OnViewWinChanged();
   Rect2D ScrollRange() const;
   Rect2D WithoutBorders(const Rect2D& view) const;
@@ -417,7 +400,7 @@ class VORL_API GraphicViewPort {
   dVect2D m_viewRefPos;
   dVect2D m_graphicRefPos;
   HandlerList m_handlers;
-  GraphicHandler* m_captured = nullptr;
+  HandlerRef m_captured;
   IGraphicViewPort* m_interface = nullptr;
 };
 

@@ -47,16 +47,17 @@ LONG WholePixel(float edge) {
 
 }  // namespace
 
+GraphicViewPort::HandlerRef::HandlerRef(const GraphicHandler& handler) : m_life(handler.m_life) {}
+
 GraphicViewPort::HandlerList::HandlerList() = default;
 
-GraphicViewPort::HandlerList::HandlerList(const HandlerList& source)
-    : std::vector<GraphicHandler*>() {
+GraphicViewPort::HandlerList::HandlerList(const HandlerList& source) : std::vector<HandlerRef>() {
   *this = source;
 }
 
 GraphicViewPort::HandlerList& GraphicViewPort::HandlerList::operator=(const HandlerList& source) {
   try {
-    std::vector<GraphicHandler*>::operator=(source);
+    std::vector<HandlerRef>::operator=(source);
   } catch (const std::bad_alloc&) {
     clear();
   }
@@ -69,12 +70,12 @@ void GraphicViewPort::SetGraphic(GraphicHandler* graphic) {
 }
 
 bool GraphicViewPort::AddGraphic(GraphicHandler* graphic) {
-  if (graphic == nullptr) {
+  if (graphic == nullptr || !graphic->StartLife()) {
     return false;
   }
-  std::erase(m_handlers, graphic);
+  Unlist(graphic);
   try {
-    m_handlers.push_back(graphic);
+    m_handlers.push_back(HandlerRef(*graphic));
   } catch (const std::bad_alloc&) {
     return false;
   }
@@ -83,19 +84,43 @@ bool GraphicViewPort::AddGraphic(GraphicHandler* graphic) {
 
 void GraphicViewPort::RemoveGraphic(GraphicHandler* graphic) {
   if (graphic == nullptr) {
-    m_captured = nullptr;
-    for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-      m_handlers[i]->SetTransformation(nullptr);
-    }
+    m_captured = HandlerRef();
+    TakeMapFromHandlers();
     m_handlers.clear();
     return;
   }
-  if (m_captured == graphic) {
-    m_captured = nullptr;
+  if (m_captured.Get() == graphic) {
+    m_captured = HandlerRef();
   }
+  Unlist(nullptr);
   if (!m_handlers.empty()) {
     graphic->SetTransformation(nullptr);
-    std::erase(m_handlers, graphic);
+    Unlist(graphic);
+  }
+}
+
+void GraphicViewPort::Unlist(const GraphicHandler* handler) {
+  std::erase_if(m_handlers, [=](const HandlerRef& ref) {
+    return ref.Get() == handler || ref.Get() == nullptr;
+  });
+}
+
+bool GraphicViewPort::IsShown(const GraphicHandler* handler) const {
+  return handler != nullptr &&
+         std::any_of(m_handlers.begin(), m_handlers.end(),
+                     [=](const HandlerRef& ref) { return ref.Get() == handler; });
+}
+
+void GraphicViewPort::TakeMapFromHandlers() {
+  // Without a copy, for which there may be no memory when the map is about to go. Where a handler
+  // has left meanwhile, the next one stands in its place; whoever comes again has no map to lose.
+  Unlist(nullptr);
+  for (std::size_t i = 0; i < m_handlers.size();) {
+    GraphicHandler* const handler = m_handlers[i].Get();
+    if (handler != nullptr) {
+      handler->SetTransformation(nullptr);
+    }
+    i += i < m_handlers.size() && m_handlers[i].Get() == handler ? 1 : 0;
   }
 }
 
@@ -161,21 +186,30 @@ void GraphicViewPort::Draw(HDC dc, Rect2D* clip, bool clipIsGraphic) {
   // Once for all handlers: the clip rectangle is mapped in place.
   ClipToWindow(dc);
   ClipTo(dc, clip, clipIsGraphic);
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (const HandlerRef& ref : handlers) {
+    GraphicHandler* const handler = ref.Get();
+    if (!IsShown(handler)) {
+      continue;
+    }
     handler->SetTransformation(&m_trafo);
-    handler->Draw(dc, *this);
+    if (IsShown(ref.Get())) {
+      handler->Draw(dc, *this);
+    }
   }
 }
 
 void GraphicViewPort::DrawActiveObject(HDC dc) {
-  if (m_captured == nullptr || !IsVisible()) {
+  GraphicHandler* const handler = m_captured.Get();
+  if (handler == nullptr || !IsVisible()) {
     return;
   }
   SelectClipRgn(dc, nullptr);
   ClipToWindow(dc);
-  m_captured->SetTransformation(&m_trafo);
-  m_captured->DrawActiveObject(dc, *this);
+  handler->SetTransformation(&m_trafo);
+  if (m_captured.Get() == handler) {
+    handler->DrawActiveObject(dc, *this);
+  }
   SelectClipRgn(dc, nullptr);
 }
 
@@ -196,7 +230,8 @@ void GraphicViewPort::EraseBkgnd(HDC dc, Rect2D* clip, bool clipIsGraphic) {
 }
 
 VGObjectView* GraphicViewPort::GetActiveGraphicObject() {
-  return m_captured != nullptr ? m_captured->GetActiveObject() : nullptr;
+  GraphicHandler* const handler = m_captured.Get();
+  return handler != nullptr ? handler->GetActiveObject() : nullptr;
 }
 
 }  // namespace vorl

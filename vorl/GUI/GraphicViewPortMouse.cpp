@@ -43,14 +43,14 @@ float ZoomOfStep(std::int64_t step, float ofNegative, float ofPositive) {
 }  // namespace
 
 bool GraphicViewPort::ProcessMouseEvent(int event, int flags, tagPOINT point) {
-  if (m_operation == 0 && m_captured == nullptr && !IsInside(point)) {
+  if (m_operation == 0 && m_captured.Get() == nullptr && !IsInside(point)) {
     return false;
   }
   if (event == MouseEvent_ButtonDown && !m_handlers.empty() &&
       OfferButtonDown(event, flags, point)) {
     return true;
   }
-  if (m_captured != nullptr) {
+  if (m_captured.Get() != nullptr) {
     return event != MouseEvent_ButtonDown && PassToCaptured(event, flags, point);
   }
   switch (event) {
@@ -66,35 +66,46 @@ bool GraphicViewPort::ProcessMouseEvent(int event, int flags, tagPOINT point) {
 }
 
 bool GraphicViewPort::OfferButtonDown(int event, int flags, const tagPOINT& point) {
-  // By index: a handler may change the list while it has the event.
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (const HandlerRef& ref : handlers) {
+    GraphicHandler* const handler = ref.Get();
+    if (!IsShown(handler)) {
+      continue;
+    }
     tagPOINT own(point);
-    m_captured = handler;
+    m_captured = ref;
     handler->SetTransformation(&m_trafo);
-    if (handler->ProcessMouseEvent(event, flags, own)) {
+    if (m_captured.Get() == handler && handler->ProcessMouseEvent(event, flags, own)) {
       return true;
     }
   }
-  m_captured = nullptr;
+  m_captured = HandlerRef();
   return false;
 }
 
 bool GraphicViewPort::PassToCaptured(int event, int flags, tagPOINT& point) {
-  m_captured->SetTransformation(&m_trafo);
-  const bool used = m_captured->ProcessMouseEvent(event, flags, point);
+  GraphicHandler* const handler = m_captured.Get();
+  handler->SetTransformation(&m_trafo);
+  if (m_captured.Get() != handler) {
+    return false;  // one of its objects has removed it
+  }
+  const bool used = handler->ProcessMouseEvent(event, flags, point);
   if (event != MouseEvent_ButtonUp) {
     return used;
   }
-  m_captured = nullptr;
+  m_captured = HandlerRef();
   return true;
 }
 
 bool GraphicViewPort::ProcessKeyEvent(int event, int flags, int key) {
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    GraphicHandler* const handler = m_handlers[i];
+  const HandlerList handlers(m_handlers);
+  for (const HandlerRef& ref : handlers) {
+    GraphicHandler* const handler = ref.Get();
+    if (!IsShown(handler)) {
+      continue;
+    }
     handler->SetTransformation(&m_trafo);
-    if (handler->ProcessKeyEvent(event, flags, key)) {
+    if (IsShown(ref.Get()) && handler->ProcessKeyEvent(event, flags, key)) {
       return true;
     }
   }

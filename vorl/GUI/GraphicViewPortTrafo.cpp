@@ -1,6 +1,5 @@
 // How modes, limits and alignment lead to the transformation, and zooming and panning it.
 
-#include <vorl/GUI/GraphicHandler.h>
 #include <vorl/GUI/GraphicViewPort.h>
 
 #include <algorithm>
@@ -100,9 +99,7 @@ void GraphicViewPort::UpdateTransformation(Rect2D& window, const Rect2D& view) {
   m_graphicWin = window;
   m_viewWin = newView;
   m_trafo.Set(m_graphicWin, draw);
-  for (std::size_t i = 0; i < m_handlers.size(); ++i) {
-    m_handlers[i]->SetTransformation(nullptr);
-  }
+  TakeMapFromHandlers();
   if (m_interface != nullptr) {
     m_interface->OnTrafoChanged(this);
   }

@@ -40,6 +40,54 @@ void Trafo2DBase::Map(Mapping mapping, const tagRECT& in, tagRECT& out) {
   Map(mapping, in.right, in.bottom, out.right, out.bottom);
 }
 
+// The forms that the four families share: name, and the mapping that they all go through.
+#define VORL_FORMS_OF(family)                                                  \
+  void Trafo2DBase::family(double x, double y, double& xOut, double& yOut) {   \
+    _##family(x, y, xOut, yOut);                                               \
+  }                                                                            \
+  void Trafo2DBase::family(double& x, double& y) {                             \
+    _##family(x, y, x, y);                                                     \
+  }                                                                            \
+  void Trafo2DBase::family(long x, long y, long& xOut, long& yOut) {           \
+    Map(&Trafo2DBase::_##family, x, y, xOut, yOut);                            \
+  }                                                                            \
+  void Trafo2DBase::family(long& x, long& y) {                                 \
+    Map(&Trafo2DBase::_##family, x, y, x, y);                                  \
+  }                                                                            \
+  void Trafo2DBase::family(std::int32_t x, std::int32_t y, std::int32_t& xOut, \
+                           std::int32_t& yOut) {                               \
+    Map(&Trafo2DBase::_##family, x, y, xOut, yOut);                            \
+  }                                                                            \
+  void Trafo2DBase::family(std::int32_t& x, std::int32_t& y) {                 \
+    Map(&Trafo2DBase::_##family, x, y, x, y);                                  \
+  }                                                                            \
+  void Trafo2DBase::family(const tagPOINT& in, tagPOINT& out) {                \
+    Map(&Trafo2DBase::_##family, in, out);                                     \
+  }                                                                            \
+  void Trafo2DBase::family(tagPOINT& point) {                                  \
+    Map(&Trafo2DBase::_##family, point, point);                                \
+  }
+
+// The forms for vectors of those families that have no virtual one.
+#define VORL_VECTOR_FORMS_OF(family)                          \
+  void Trafo2DBase::family(const dVect2D& in, dVect2D& out) { \
+    Map(&Trafo2DBase::_##family, in, out);                    \
+  }                                                           \
+  void Trafo2DBase::family(dVect2D& vector) {                 \
+    Map(&Trafo2DBase::_##family, vector, vector);             \
+  }
+
+VORL_FORMS_OF(pA2B)
+VORL_FORMS_OF(pB2A)
+VORL_FORMS_OF(vA2B)
+VORL_FORMS_OF(vB2A)
+VORL_VECTOR_FORMS_OF(pB2A)
+VORL_VECTOR_FORMS_OF(vA2B)
+VORL_VECTOR_FORMS_OF(vB2A)
+
+#undef VORL_FORMS_OF
+#undef VORL_VECTOR_FORMS_OF
+
 void Trafo2DBase::pA2B(dVect2D& in, dVect2D& out) {
   Map(&Trafo2DBase::_pA2B, in, out);
 }
@@ -51,158 +99,6 @@ void Trafo2DBase::pA2B(const dVect2D& in, dVect2D& out) {
 
 void Trafo2DBase::pA2B(dVect2D& point) {
   pA2B(point, point);
-}
-
-void Trafo2DBase::pA2B(double x, double y, double& xOut, double& yOut) {
-  _pA2B(x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pA2B(double& x, double& y) {
-  _pA2B(x, y, x, y);
-}
-
-void Trafo2DBase::pA2B(long x, long y, long& xOut, long& yOut) {
-  Map(&Trafo2DBase::_pA2B, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pA2B(long& x, long& y) {
-  Map(&Trafo2DBase::_pA2B, x, y, x, y);
-}
-
-void Trafo2DBase::pA2B(std::int32_t x, std::int32_t y, std::int32_t& xOut, std::int32_t& yOut) {
-  Map(&Trafo2DBase::_pA2B, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pA2B(std::int32_t& x, std::int32_t& y) {
-  Map(&Trafo2DBase::_pA2B, x, y, x, y);
-}
-
-void Trafo2DBase::pA2B(const tagPOINT& in, tagPOINT& out) {
-  Map(&Trafo2DBase::_pA2B, in, out);
-}
-
-void Trafo2DBase::pA2B(tagPOINT& point) {
-  Map(&Trafo2DBase::_pA2B, point, point);
-}
-
-void Trafo2DBase::pB2A(const dVect2D& in, dVect2D& out) {
-  Map(&Trafo2DBase::_pB2A, in, out);
-}
-
-void Trafo2DBase::pB2A(dVect2D& point) {
-  Map(&Trafo2DBase::_pB2A, point, point);
-}
-
-void Trafo2DBase::pB2A(double x, double y, double& xOut, double& yOut) {
-  _pB2A(x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pB2A(double& x, double& y) {
-  _pB2A(x, y, x, y);
-}
-
-void Trafo2DBase::pB2A(long x, long y, long& xOut, long& yOut) {
-  Map(&Trafo2DBase::_pB2A, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pB2A(long& x, long& y) {
-  Map(&Trafo2DBase::_pB2A, x, y, x, y);
-}
-
-void Trafo2DBase::pB2A(std::int32_t x, std::int32_t y, std::int32_t& xOut, std::int32_t& yOut) {
-  Map(&Trafo2DBase::_pB2A, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::pB2A(std::int32_t& x, std::int32_t& y) {
-  Map(&Trafo2DBase::_pB2A, x, y, x, y);
-}
-
-void Trafo2DBase::pB2A(const tagPOINT& in, tagPOINT& out) {
-  Map(&Trafo2DBase::_pB2A, in, out);
-}
-
-void Trafo2DBase::pB2A(tagPOINT& point) {
-  Map(&Trafo2DBase::_pB2A, point, point);
-}
-
-void Trafo2DBase::vA2B(const dVect2D& in, dVect2D& out) {
-  Map(&Trafo2DBase::_vA2B, in, out);
-}
-
-void Trafo2DBase::vA2B(dVect2D& vector) {
-  Map(&Trafo2DBase::_vA2B, vector, vector);
-}
-
-void Trafo2DBase::vA2B(double x, double y, double& xOut, double& yOut) {
-  _vA2B(x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vA2B(double& x, double& y) {
-  _vA2B(x, y, x, y);
-}
-
-void Trafo2DBase::vA2B(long x, long y, long& xOut, long& yOut) {
-  Map(&Trafo2DBase::_vA2B, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vA2B(long& x, long& y) {
-  Map(&Trafo2DBase::_vA2B, x, y, x, y);
-}
-
-void Trafo2DBase::vA2B(std::int32_t x, std::int32_t y, std::int32_t& xOut, std::int32_t& yOut) {
-  Map(&Trafo2DBase::_vA2B, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vA2B(std::int32_t& x, std::int32_t& y) {
-  Map(&Trafo2DBase::_vA2B, x, y, x, y);
-}
-
-void Trafo2DBase::vA2B(const tagPOINT& in, tagPOINT& out) {
-  Map(&Trafo2DBase::_vA2B, in, out);
-}
-
-void Trafo2DBase::vA2B(tagPOINT& vector) {
-  Map(&Trafo2DBase::_vA2B, vector, vector);
-}
-
-void Trafo2DBase::vB2A(const dVect2D& in, dVect2D& out) {
-  Map(&Trafo2DBase::_vB2A, in, out);
-}
-
-void Trafo2DBase::vB2A(dVect2D& vector) {
-  Map(&Trafo2DBase::_vB2A, vector, vector);
-}
-
-void Trafo2DBase::vB2A(double x, double y, double& xOut, double& yOut) {
-  _vB2A(x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vB2A(double& x, double& y) {
-  _vB2A(x, y, x, y);
-}
-
-void Trafo2DBase::vB2A(long x, long y, long& xOut, long& yOut) {
-  Map(&Trafo2DBase::_vB2A, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vB2A(long& x, long& y) {
-  Map(&Trafo2DBase::_vB2A, x, y, x, y);
-}
-
-void Trafo2DBase::vB2A(std::int32_t x, std::int32_t y, std::int32_t& xOut, std::int32_t& yOut) {
-  Map(&Trafo2DBase::_vB2A, x, y, xOut, yOut);
-}
-
-void Trafo2DBase::vB2A(std::int32_t& x, std::int32_t& y) {
-  Map(&Trafo2DBase::_vB2A, x, y, x, y);
-}
-
-void Trafo2DBase::vB2A(const tagPOINT& in, tagPOINT& out) {
-  Map(&Trafo2DBase::_vB2A, in, out);
-}
-
-void Trafo2DBase::vB2A(tagPOINT& vector) {
-  Map(&Trafo2DBase::_vB2A, vector, vector);
 }
 
 void Trafo2DBase::rA2B(Rect2D& in, Rect2D& out) {

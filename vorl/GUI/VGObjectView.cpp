@@ -1,6 +1,7 @@
 #include <vorl/GUI/VGObjectView.h>
 
 #include <vorl/GUI/GraphicHandler.h>
+#include <vorl/GUI/detail/ObjectWatch.h>
 
 inline namespace vorl {
 
@@ -12,35 +13,6 @@ constexpr std::uint16_t kDynamicallyCreated = 0x8000;
 Trafo2DBase* SharedIdentity() {
   static Translate2D identity;
   return &identity;
-}
-
-/// The handlers of one operation.
-struct OperationHandlers {
-  using Handler = bool (VGObjectView::*)(dVect2D&);
-
-  short operation;
-  Handler begin;
-  Handler proceed;
-  Handler end;
-};
-
-constexpr OperationHandlers kOperations[] = {
-    {VGOperation_Move, &VGObjectView::OnBeginMove, &VGObjectView::OnMove, &VGObjectView::OnEndMove},
-    {VGOperation_Resize, &VGObjectView::OnBeginResize, &VGObjectView::OnResize,
-     &VGObjectView::OnEndResize},
-    {VGOperation_Modify, &VGObjectView::OnBeginModify, &VGObjectView::OnModify,
-     &VGObjectView::OnEndModify},
-    {VGOperation_Rotate, &VGObjectView::OnBeginRotate, &VGObjectView::OnRotate,
-     &VGObjectView::OnEndRotate},
-};
-
-const OperationHandlers* HandlersOf(short operation) {
-  for (const OperationHandlers& handlers : kOperations) {
-    if (handlers.operation == operation) {
-      return &handlers;
-    }
-  }
-  return nullptr;
 }
 
 std::uint16_t Bits(short bits) {
@@ -94,6 +66,7 @@ VGObjectView& VGObjectView::operator=(const VGObjectView& source) {
 }
 
 VGObjectView::~VGObjectView() {
+  Watch::End(m_watch);
   for (GraphicHandler* const handler : m_handlers) {
     handler->Forget(this);
   }
@@ -129,89 +102,13 @@ void VGObjectView::SetTransformation(Trafo2DBase* trafo) {
   Transform(false);
 }
 
-bool VGObjectView::IsPointOnGraphic(tagPOINT& point, int tolerance) {
-  dVect2D p(point);
-  return IsPointOnGraphic(p, tolerance);
-}
-
-bool VGObjectView::IsPointOnGraphic(dVect2D& /*point*/, int /*tolerance*/) {
-  return false;
-}
-
-short VGObjectView::GetSelectionState(int flags, tagPOINT& point) {
-  dVect2D p(point);
-  return GetSelectionState(flags, p);
-}
-
-short VGObjectView::GetSelectionState(int /*flags*/, dVect2D& /*point*/) {
-  return VGOperation_None;
-}
-
-bool VGObjectView::ProcessMouseEvent(int event, int flags, tagPOINT& point) {
-  dVect2D p(point);
-  return ProcessMouseEvent(event, flags, p);
-}
-
-bool VGObjectView::ProcessMouseEvent(int event, int flags, dVect2D& point) {
-  const bool isLeftClick = event == MouseEvent_ButtonDown && (flags & MK_LBUTTON) != 0;
-  if (isLeftClick && m_viewState == 0 && IsEnabled(VGOperation_Create)) {
-    AssignViewState(VGViewState_Visible);
-    SetOpState(VGOperation_Create);
-  }
-  if (!IsVisible()) {
-    return false;
-  }
-  if (isLeftClick && m_opState == VGOperation_None) {
-    const short grabbed = GetSelectionState(flags, point);
-    if (IsEnabled(grabbed)) {
-      SetOpState(grabbed);
-    } else if (IsEnabled(VGOperation_Move)) {
-      SetOpState(VGOperation_Move);
-    }
-  }
-  return Dispatch(event, flags, point);
-}
-
-bool VGObjectView::Dispatch(int event, int flags, dVect2D& point) {
-  if (event != MouseEvent_ButtonDown && event != MouseEvent_Move && event != MouseEvent_ButtonUp) {
-    return false;
-  }
-  const short operation = GetOpState();  // before a handler ends it
-  if (operation == VGOperation_Create) {
-    return OnCreate(event, flags, point);
-  }
-  const OperationHandlers* const handlers = HandlersOf(operation);
-  if (handlers == nullptr) {
-    return false;
-  }
-  // The interface is told last: its client may destroy the object.
-  if (event == MouseEvent_ButtonDown) {
-    const bool result = (this->*handlers->begin)(point);
-    if (m_pInterface != nullptr) {
-      m_pInterface->OnBeginGraphicOp(this, operation);
-    }
-    return result;
-  }
-  if (event == MouseEvent_Move) {
-    const bool result = (this->*handlers->proceed)(point);
-    if (m_pInterface != nullptr) {
-      m_pInterface->OnGraphicChanged(this, operation);
-    }
-    return result;
-  }
-  const bool result = (this->*handlers->end)(point);
-  if (m_pInterface != nullptr) {
-    m_pInterface->OnEndGraphicOp(this, operation);
-  }
-  return result;
-}
-
 void VGObjectView::Draw(HDC dc, GraphicViewPort& viewPort) {
   if (!IsVisible()) {
     return;
   }
+  const Watch watch(*this);
   DrawGraphic(dc, viewPort);
-  if (IsSelected()) {
+  if (!watch.IsGone() && IsSelected()) {
     DrawSelection(dc, viewPort);
   }
 }
@@ -220,8 +117,9 @@ void VGObjectView::Draw(HDC dc) {
   if (!IsVisible()) {
     return;
   }
+  const Watch watch(*this);
   DrawGraphic(dc);
-  if (IsSelected()) {
+  if (!watch.IsGone() && IsSelected()) {
     DrawSelection(dc);
   }
 }
@@ -259,58 +157,6 @@ void VGObjectView::SetPenColor(int color) {
 
 void VGObjectView::SetROPMode(int rop) {
   m_ropMode = rop;
-}
-
-bool VGObjectView::OnCreate(int /*event*/, int /*flags*/, dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnBeginMove(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnMove(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnEndMove(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnBeginResize(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnResize(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnEndResize(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnBeginModify(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnModify(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnEndModify(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnBeginRotate(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnRotate(dVect2D& /*point*/) {
-  return false;
-}
-
-bool VGObjectView::OnEndRotate(dVect2D& /*point*/) {
-  return false;
 }
 
 void VGObjectView::ViewDataChanged() {

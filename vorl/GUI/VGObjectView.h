@@ -82,7 +82,8 @@ class VORL_API IVGObjectView {
 /// objects are drawn with their handles.
 ///
 /// *Ownership.* The interface and the transformation stay the caller's and must live as long as
-/// they are set. An object that is destroyed leaves the lists of all its handlers by itself.
+/// they are set. An object that is destroyed leaves the lists of all its handlers by itself. What
+/// it calls of its own, to draw or to take an event, may destroy it.
 class VORL_API VGObjectView {
  public:
   virtual ~VGObjectView();
@@ -210,6 +211,8 @@ class VORL_API VGObjectView {
  private:
   friend class GraphicHandler;
 
+  class Watch;
+
   long DefaultID() const;
   void CopyLook(const VGObjectView& source);
   bool Dispatch(int event, int flags, dVect2D& point);
@@ -228,6 +231,7 @@ class VORL_API VGObjectView {
   std::uint8_t m_lineDistance = 2;
   std::uint8_t m_handleDistance = 4;
   std::vector<GraphicHandler*> m_handlers;  ///< whose lists hold this object
+  Watch* m_watch = nullptr;                 ///< the last one that waits for the object's end
 };
 
 }  // namespace vorl
