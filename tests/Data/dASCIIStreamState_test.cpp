@@ -99,8 +99,8 @@ TEST_F(dASCIIStreamState, ReadingGoesOnFromWhereNothingCouldBeRead) {
   ASSERT_FALSE(stream.SetPos(150));
   char ch = '?';
   EXPECT_FALSE(stream.NextChar(&ch));
-  std::string text(150, '-');
-  Write(text.append("abcdef"));
+  std::string content(150, '-');
+  Write(content.append("abcdef"));
   std::string text;
   for (int i = 0; i < 10 && stream.NextChar(&ch); ++i) {
     text += ch;
