@@ -66,6 +66,15 @@ TEST(dDIBCombine, BitmapCanBeDrawnIntoItself) {
   EXPECT_EQ(std::memcmp(dib.GetDataPtr(), "abcd", 4), 0);
 }
 
+TEST(dDIBCombine, SourceMayBeSelectedElsewhere) {
+  dDIB target(2, 1, 1, 8);
+  dDIB source(2, 1, 1, 8);
+  source.Fill(0x35);
+  const SelectedBitmap elsewhere(source.GetHandle());
+  ASSERT_TRUE(target.Combine(source, 0, 0, static_cast<int>(SRCCOPY)));
+  EXPECT_EQ(Byte(target, 1, 0, 0), 0x35);
+}
+
 TEST(dDIBCombine, BothSectionsMustBeThere) {
   dDIB dib(4, 4, 1, 8);
   dDIB empty;

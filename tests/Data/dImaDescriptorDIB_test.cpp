@@ -157,6 +157,27 @@ TEST(dImaDescriptorDIB, RefusesRowsThatAreNotAMultipleOfFourBytes) {
   EXPECT_FALSE(descriptor.IsValid());
 }
 
+TEST(dImaDescriptorDIB, RowsAreLookedAtBeforeTheLayout) {
+  dImage image = MakeImage(3, 2, ImageDataType_U16, "G", 2);
+  dImaDescriptorDIB descriptor(image);
+  EXPECT_STREQ(descriptor.GetStatus(), "image rows are not 4 byte aligned");
+}
+
+TEST(dImaDescriptorDIB, ResetForgetsTheImage) {
+  dImage image = MakeImage(4, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  EXPECT_TRUE(descriptor.IsCurrent());
+  descriptor.Reset();
+  EXPECT_FALSE(descriptor.IsValid());
+  EXPECT_FALSE(descriptor.IsCurrent());
+  EXPECT_EQ(descriptor.GetHeader(), nullptr);
+  EXPECT_EQ(descriptor.GetPixelData(), nullptr);
+  EXPECT_EQ(descriptor.GetPalette(), nullptr);
+  EXPECT_EQ(descriptor.GetPaletteSize(), 0);
+  EXPECT_FALSE(descriptor.ResetPalette(true));
+  EXPECT_TRUE(image.IsValid());
+}
+
 TEST(dImaDescriptorDIB, RefusesOtherLayoutsByName) {
   const auto reasonFor = [](unsigned short type, const char* sequence, unsigned short order) {
     dImage image;
