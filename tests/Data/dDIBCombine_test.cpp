@@ -83,6 +83,8 @@ TEST(dDIBCombine, BothSectionsMustBeThere) {
   EXPECT_EQ(StatusText(empty), "Combine: missing target bitmap handle");
   EXPECT_FALSE(dib.Combine(empty, 0, 0, static_cast<int>(SRCCOPY)));
   EXPECT_EQ(StatusText(dib), "Combine: missing source bitmap handle");
+  EXPECT_TRUE(dib.Combine(dib, 0, 0, static_cast<int>(SRCCOPY)));
+  EXPECT_EQ(dib.GetStatus(), 0);
   EXPECT_EQ(log.errors,
             (std::vector<std::string>{"dDIB::Combine: Combine: missing target bitmap handle",
                                       "dDIB::Combine: Combine: missing source bitmap handle"}));

@@ -9,6 +9,7 @@
 #include <limits>
 #include <string>
 #include <system_error>
+#include <utility>
 
 #if !defined(_WIN32)
 #include <sys/stat.h>
@@ -79,12 +80,15 @@ TEST_F(dDIBSave, BitmapWithoutPixelsIsNotSaved) {
 TEST_F(dDIBSave, FailureOfTheDescriptorIsTold) {
   dDIB dib(3, 2, 1, 8);
   ASSERT_TRUE(dib.Save("a.bmp", false));
+  LogRecorder log;
   EXPECT_FALSE(dib.Save("a.bmp", false));
   EXPECT_EQ(StatusText(dib), "dDIB::Save: error:file already exists:'a.bmp'");
   EXPECT_FALSE(dib.Save("", false));
   EXPECT_EQ(StatusText(dib), "dDIB::Save: error:NULL parameter:'FilePath'");
   EXPECT_TRUE(dib.IsValid());
+  EXPECT_EQ(log.errors.back(), "dDIB::Save: dDIB::Save: error:NULL parameter:'FilePath'");
   EXPECT_TRUE(dib.Save("a.bmp", true));
+  EXPECT_EQ(dib.GetStatus(), 0);
 }
 
 /// Saves a bitmap without a name. Every such call of this program is made here, in whatever order
@@ -293,7 +297,10 @@ TEST_F(IsBitmapFile, OtherFilesAreToldAsInformation) {
   bitmap.width = std::numeric_limits<std::int32_t>::min();
   bitmap.rows = {0};
   std::vector<Bytes> files{
-      {}, {'B', 'M'}, {whole.begin(), whole.begin() + 53}, bitmap_test::FileOf(bitmap), whole};
+      {}, {'B', 'M'}, {whole.begin(), whole.begin() + 53}, bitmap_test::FileOf(bitmap)};
+  std::swap(bitmap.width, bitmap.height);
+  files.push_back(bitmap_test::FileOf(bitmap));
+  files.push_back(whole);
   files.back()[0] = 'A';
   for (const Bytes& bytes : files) {
     MakeFile(bytes);
