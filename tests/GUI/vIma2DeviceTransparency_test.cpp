@@ -185,6 +185,46 @@ TEST(vIma2DeviceTransparent, NewPixelsAreLookedAtWhenTheTransparencyIsSetAnew) {
   }
 }
 
+TEST(vIma2DeviceTransparent, BitmapsAreMadeOnceForAnImage) {
+  dImage image = Pattern("BGR");
+  const dImage before(image);
+  const tagRECT target{1, 2, 7, 6};
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+  renderer.EnableTransparency(0xE0E0E0UL);
+  Canvas canvas(10, 8);
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  image.Fill(0x11);
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));  // what the image was
+  ExpectPicture(canvas, before, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+  image = Pattern("G");  // formatted anew: what it is
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+}
+
+TEST(vIma2DeviceTransparent, CopyLooksAtTheSamePixel) {
+  dImage image = Pattern("BGR");
+  const tagRECT source{0, 0, 6, 3};
+  const tagRECT target{1, 2, 7, 5};
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, &source, &target, false, true));
+  renderer.EnableTransparency(5, 2);
+  const vIma2Device first(renderer);
+  vIma2Device copy(first);
+  Canvas canvas(10, 8);
+  Canvas other(10, 8);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ASSERT_TRUE(copy.Draw(other));
+  for (int y = 0; y < 8; ++y) {
+    for (int x = 0; x < 10; ++x) {
+      EXPECT_EQ(other.At(x, y), canvas.At(x, y)) << x << ", " << y;
+    }
+  }
+}
+
 TEST(vIma2DeviceTransparent, ModeForgetsTheSettingOfTheOther) {
   dImage image = Pattern("G");
   *static_cast<unsigned char*>(image.GetDataPtr(3, 2)) = 0;

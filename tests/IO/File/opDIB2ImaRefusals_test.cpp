@@ -308,6 +308,16 @@ TEST_F(opDIB2ImaMemory, HeaderIsCheckedLikeThatOfAFile) {
   EXPECT_EQ(Refusal(&m_info, m_bits), "opDIB2Ima: unsupported pixel depth: 5");
 }
 
+TEST_F(opDIB2ImaMemory, ImageWhoseOwnBitsAreRefusedIsResetToo) {
+  dImage image;
+  ASSERT_TRUE(image.Init(4, 4, ImageDataType_U8, "BGR", 0, 4));
+  m_info.bmiHeader.biBitCount = 5;
+  opDIB2Ima op;
+  EXPECT_FALSE(op.Convert(&m_info, image.GetDataPtr(), image));
+  EXPECT_STREQ(op.GetStatus(), "opDIB2Ima: unsupported pixel depth: 5");
+  EXPECT_FALSE(image.IsValid());
+}
+
 TEST_F(opDIB2ImaMemory, ImageThatCannotBeHadTellsWhy) {
   m_info.bmiHeader.biWidth = kHighest;
   m_info.bmiHeader.biHeight = -kHighest;
