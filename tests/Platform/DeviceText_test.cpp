@@ -48,7 +48,7 @@ std::u32string TextOf(const TextLine& line) {
 // The texts of the lines; `limit` in widths of "m".
 std::vector<std::u32string> Lines(const std::u32string& text, UINT format, int limit = 0) {
   const auto font = FontFace::Find(Description(-20));
-  const std::int64_t width = std::int64_t{limit} * font->GlyphOf(U'm').advance;
+  const std::int64_t width = std::int64_t{limit} * font->GlyphOf(U'm')->advance;
   std::vector<std::u32string> lines;
   for (const TextLine& line : LayOutText(text, *font, TextFormat(format), width)) {
     lines.push_back(TextOf(line));
@@ -164,9 +164,9 @@ TEST(DeviceText, RectanglesAtTheEndsOfThePlane) {
 
 TEST(DeviceText, MissingCharactersAreShownAsSuch) {
   const auto font = FontFace::Find(Description(-30));
-  const vorl_detail::Glyph& glyph = font->GlyphOf(0x10FFFD);  // for private use
-  EXPECT_GT(glyph.advance, 0);
-  EXPECT_EQ(glyph.coverage, font->GlyphOf(0x10FFFC).coverage);
+  const auto glyph = font->GlyphOf(0x10FFFD);  // for private use
+  EXPECT_GT(glyph->advance, 0);
+  EXPECT_EQ(glyph->coverage, font->GlyphOf(0x10FFFC)->coverage);
 }
 
 TEST(DeviceText, ALineOfPositiveHeightFits) {
