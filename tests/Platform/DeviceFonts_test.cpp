@@ -8,12 +8,15 @@
 #include <fontconfig/fontconfig.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cstddef>
+#include <cstdint>
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <random>
 #include <set>
 #include <string>
 
@@ -221,6 +224,9 @@ int InstallOneFont(const fs::path& folder) {
   }
   std::ifstream source(reinterpret_cast<const char*>(name), std::ios::binary);
   std::string bytes{std::istreambuf_iterator<char>(source), std::istreambuf_iterator<char>()};
+  FcPatternDestroy(match);
+  FcPatternDestroy(wanted);
+  FcFini();
   const auto byteAt = [&bytes](std::size_t i) { return std::size_t{static_cast<BYTE>(bytes[i])}; };
   const auto table = [&](const char* tag) {  // its place, of which files have few enough bytes
     const std::size_t entry = bytes.find(tag);
@@ -245,7 +251,8 @@ bool Holds(bool condition, const char* text) {
 
 // What the font lacks is made of what it has.
 [[noreturn]] void UseOneFont() {
-  const fs::path folder = fs::path(testing::TempDir()) / "vorl-one-font";
+  const fs::path folder = fs::path(testing::TempDir()) /
+                          (std::string("vorl-one-font-") + std::to_string(std::random_device()()));
   const int unitsPerEm = InstallOneFont(folder);
   bool isGood = Holds(unitsPerEm > 0, "a font is found");
   isGood &= Holds(InkOf(Description(-60, FW_BOLD), U'I') > InkOf(Description(-60), U'I') * 11 / 10,
