@@ -44,7 +44,8 @@ class BitmapSource;
 /// - "opDIB2Ima: unsupported header size: %lu", "opDIB2Ima: invalid number of planes: %d",
 ///   "opDIB2Ima: unsupported compression: %s", "opDIB2Ima: invalid bitmap size: %ld x %ld",
 ///   "opDIB2Ima: unsupported pixel depth: %d";
-/// - "can't initialize the output image: " and the image's message.
+/// - "can't initialize the output image: " and the image's message, or "it has another format": the
+///   `Init` of a derived class succeeded, but gave it other pixels than it was asked for.
 ///
 /// What a file claims is compared with its size before anything is allocated.
 ///
