@@ -16,6 +16,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <memory>
 #include <random>
 #include <set>
 #include <string>
@@ -139,6 +140,21 @@ TEST(DeviceFonts, WeightMakesStrokesThicker) {
 TEST(DeviceFonts, ItalicLeans) {
   EXPECT_NEAR(LeanOf(Description(-60)), 0.0, 0.6);
   EXPECT_GT(LeanOf(Description(-60, FW_NORMAL, 1)), 5.0);
+  EXPECT_LT(LeanOf(Description(-60, FW_NORMAL, 1)), 13.0) << "it leans twice";
+}
+
+TEST(DeviceFonts, FontsThatNobodyUsesAreNotKeptForEver) {
+  const std::weak_ptr<FontFace> font = FontFace::Find(Description(-31));
+  EXPECT_FALSE(font.expired());
+  for (int height = 100; height < 150; ++height) {
+    FontFace::Find(Description(-31));
+    FontFace::Find(Description(-height));
+  }
+  EXPECT_FALSE(font.expired()) << "it was used";
+  for (int height = 100; height < 150; ++height) {
+    FontFace::Find(Description(-height));
+  }
+  EXPECT_TRUE(font.expired());
 }
 
 TEST(DeviceFonts, StockFontsAreWhatTheirNamesSay) {

@@ -117,6 +117,26 @@ TEST(DeviceText, AmpersandsUnderlineTheLastLetterMarked) {
   EXPECT_EQ(Lines(U"&a", DT_NOPREFIX), Texts{U"&a"});
 }
 
+TEST(DeviceText, UnderlinedLetterHasALineOneShorterThanItself) {
+  TestSection s(60, -60, 32);
+  SetBkMode(s.dc, TRANSPARENT);
+  SetTextColor(s.dc, RGB(255, 255, 255));
+  const HFONT selected = CreateFontA(-30, 0, 0, 0, FW_NORMAL, 0, 0, 0, 1, 0, 0, 0, 0, "");
+  const HGDIOBJ old = SelectObject(s.dc, selected);
+  RECT rect{5, 7, 60, 60};
+  DrawTextA(s.dc, "& ", -1, &rect, 0);
+  const auto font = FontFace::Find(Description(-30));
+  const int row = 7 + font->Metrics().ascent + 1;
+  const int end = 5 + font->GlyphOf(U' ')->advance - 1;
+  for (int y = 0; y < 60; ++y) {
+    for (int x = 0; x < 60; ++x) {
+      EXPECT_EQ((s.At(x, y) & 0xFFFFFFU) != 0, y == row && x >= 5 && x < end) << x << ", " << y;
+    }
+  }
+  SelectObject(s.dc, old);
+  DeleteObject(selected);
+}
+
 TEST(DeviceText, TabStopsMayBeGiven) {
   const auto font = FontFace::Find(Description(-20));
   const int average = font->Metrics().averageWidth;

@@ -133,6 +133,12 @@ void StockBitmap() {
       Report("q", pixels[2]);
     }
   }
+  header.h.biClrUsed = 7;
+  header.h.biClrImportant = 5;
+  header.h.biBitCount = 8;
+  Report("r", GetDIBits(dc, bitmap, 0, 1, nullptr, info, 0));
+  Report("used", header.h.biClrUsed);
+  Report("important", header.h.biClrImportant);
   DeleteDC(dc);
 }
 
