@@ -102,10 +102,10 @@ bool SharesBytes(const dImage& image, const void* bytes, std::uint64_t size) {
 }
 
 /// True when the image has the pixels that were asked for: the `Init` of a derived class may have
-/// given it others. Rows may have any alignment.
+/// given it others, of several planes for example, whose columns lie closer together. Rows may have
+/// any alignment.
 bool HasPixels(const dImage& image, unsigned long columns, unsigned long rows, int bitsPerPixel) {
   return image.IsValid() && image.GetWidth() == columns && image.GetHeight() == rows &&
-         image.GetDataOrder() == ImageDataOrder_Pixel &&
          image.GetColumnOffset() == static_cast<unsigned long>(bitsPerPixel) &&
          std::uint64_t{image.GetBytesPerRow()} * rows <= image.GetImageSize();
 }
