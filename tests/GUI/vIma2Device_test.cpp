@@ -364,12 +364,14 @@ TEST(vIma2DeviceErase, TargetIsExcludedWhenThereIsAnImage) {
 TEST(vIma2DeviceErase, DeviceThatIsNoneFails) {
   vIma2Device renderer;
   const tagRECT region{0, 0, 6, 4};
-  const tagRECT excluded{1, 1, 2, 2};
   EXPECT_FALSE(renderer.EraseBackground(nullptr, &region, nullptr, kColour));
+#if !defined(_WIN32)  // not every system tells of a device that is gone
+  const tagRECT excluded{1, 1, 2, 2};
   const HDC dc = CreateCompatibleDC(nullptr);
   DeleteDC(dc);
   EXPECT_FALSE(renderer.EraseBackground(dc, &region, nullptr, kColour));
   EXPECT_FALSE(renderer.EraseBackground(dc, &region, &excluded, kColour));
+#endif
 }
 
 }  // namespace
