@@ -1,13 +1,12 @@
 #include <study/Error.h>
 #include <study/OutputFile.h>
 #include <study/Pictures.h>
+#include <study/PngProblem.h>
 
 #include <bit>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
-#include <memory>
-#include <string>
 #include <vector>
 
 #include <png.h>
@@ -18,33 +17,27 @@ namespace {
 /// What the writing functions of the PNG library share.
 struct PngJob {
   std::FILE* file = nullptr;
-  std::string problem;
+  PngProblem problem;
 };
 
-void OnError(png_structp png, png_const_charp message) {
-  auto* job = static_cast<PngJob*>(png_get_error_ptr(png));
-  if (job->problem.empty()) {
-    job->problem = message;
-  }
-  png_longjmp(png, 1);
+const char* WritingProblem() {
+  return errno != 0 ? std::strerror(errno) : "the writing failed";
 }
-
-void OnWarning(png_structp, png_const_charp) {}
 
 void WriteBytes(png_structp png, png_bytep data, png_size_t size) {
   auto* job = static_cast<PngJob*>(png_get_io_ptr(png));
   errno = 0;
   if (std::fwrite(data, 1, size, job->file) != size) {
-    job->problem = errno != 0 ? std::strerror(errno) : "the writing failed";
-    png_error(png, "write");
+    png_error(png, WritingProblem());
   }
 }
 
 void FlushBytes(png_structp) {}
 
-/// Everything that may jump out: only trivial objects live here.
+/// Everything that may be jumped out of: see PngProblem.h.
 bool WriteImage(PngJob& job, const dImage& image, png_bytepp rows) {
-  png_structp png = png_create_write_struct(PNG_LIBPNG_VER_STRING, &job, OnError, OnWarning);
+  png_structp png =
+      png_create_write_struct(PNG_LIBPNG_VER_STRING, &job.problem, OnPngError, OnPngWarning);
   png_infop info = png != nullptr ? png_create_info_struct(png) : nullptr;
   if (info == nullptr || setjmp(png_jmpbuf(png)) != 0) {
     png_destroy_write_struct(&png, &info);
@@ -98,12 +91,11 @@ void SavePng(const dImage& image, const std::filesystem::path& path) {
   bool written = WriteImage(job, image, rows.data());
   errno = 0;
   if (std::fclose(job.file) != 0 && written) {
-    job.problem = errno != 0 ? std::strerror(errno) : "the writing failed";
+    job.problem.Set(WritingProblem());
     written = false;
   }
   if (!written) {
-    throw Error("can't write " + Quoted(path.string()) + ": " +
-                (job.problem.empty() ? "no memory" : job.problem));
+    throw Error("can't write " + Quoted(path.string()) + ": " + job.problem.Text());
   }
   output.Commit();
 }

@@ -1,9 +1,8 @@
 #include <study/Error.h>
 #include <study/Pictures.h>
+#include <study/PngProblem.h>
 
-#include <cstdio>
-#include <memory>
-#include <string>
+#include <fstream>
 #include <vector>
 
 #include <png.h>
@@ -14,102 +13,117 @@ namespace {
 /// No deflated byte stands for more bytes than this: a header that promises more lies.
 constexpr std::uintmax_t kLargestExpansion = 1040;
 
-struct CloseFile {
-  void operator()(std::FILE* file) const { std::fclose(file); }
-};
-
-/// What the reading functions of the PNG library share.
-struct PngReading {
-  std::FILE* file = nullptr;
-  dImage* image = nullptr;
-  std::vector<png_bytep> rows;
-  std::uintmax_t fileSize = 0;
-  std::string problem;
-};
-
-void OnError(png_structp png, png_const_charp message) {
-  auto* reading = static_cast<PngReading*>(png_get_error_ptr(png));
-  if (reading->problem.empty()) {
-    reading->problem = message;
+void ReadBytes(png_structp png, png_bytep data, png_size_t size) {
+  auto* const file = static_cast<std::ifstream*>(png_get_io_ptr(png));
+  if (!file->read(reinterpret_cast<char*>(data), static_cast<std::streamsize>(size))) {
+    png_error(png, "it ends too early");
   }
-  png_longjmp(png, 1);
 }
 
-void OnWarning(png_structp, png_const_charp) {}
+/// A PNG file that is being read. The two functions that may be jumped out of do nothing else: see
+/// PngProblem.h.
+class PngFile {
+ public:
+  explicit PngFile(std::ifstream& file)
+      : m_png(png_create_read_struct(PNG_LIBPNG_VER_STRING, &m_problem, OnPngError, OnPngWarning)),
+        m_info(m_png != nullptr ? png_create_info_struct(m_png) : nullptr) {
+    if (m_info != nullptr) {
+      png_set_read_fn(m_png, &file, ReadBytes);
+    }
+  }
+  PngFile(const PngFile&) = delete;
+  PngFile& operator=(const PngFile&) = delete;
+  ~PngFile() { png_destroy_read_struct(&m_png, &m_info, nullptr); }
 
-/// Formats the image and lists its rows; false with the problem.
-bool MakeRows(PngReading& reading, png_structp png, png_infop info) {
-  const unsigned long height = png_get_image_height(png, info);
-  const std::uintmax_t bytes = std::uintmax_t{png_get_rowbytes(png, info)} * height;
-  if (bytes / kLargestExpansion > reading.fileSize) {
-    reading.problem = "it is too short for its size";
+  /// Reads what comes before the pixels, and settles what they become.
+  bool ReadHeader();
+  bool ReadRows(png_bytepp rows);
+
+  png_uint_32 Width() const { return png_get_image_width(m_png, m_info); }
+  png_uint_32 Height() const { return png_get_image_height(m_png, m_info); }
+  int Channels() const { return png_get_channels(m_png, m_info); }
+  std::uintmax_t RowBytes() const { return png_get_rowbytes(m_png, m_info); }
+  const char* Problem() const { return m_problem.Text(); }
+
+ private:
+  PngProblem m_problem;
+  png_structp m_png;
+  png_infop m_info;
+};
+
+bool PngFile::ReadHeader() {
+  if (m_info == nullptr || setjmp(png_jmpbuf(m_png)) != 0) {
     return false;
   }
-  const int channels = png_get_channels(png, info);
+  png_read_info(m_png, m_info);
+  if (png_get_bit_depth(m_png, m_info) == 16) {
+    png_error(m_png, "it has 16 bits per sample, 8 are the most");
+  }
+  png_set_expand(m_png);  // palettes to colours, fewer bits to 8, a transparent colour to a channel
+  if ((png_get_color_type(m_png, m_info) & PNG_COLOR_MASK_COLOR) == 0 &&
+      ((png_get_color_type(m_png, m_info) & PNG_COLOR_MASK_ALPHA) != 0 ||
+       png_get_valid(m_png, m_info, PNG_INFO_tRNS) != 0)) {
+    png_set_gray_to_rgb(m_png);  // grey with transparency has no layout of its own
+  }
+  png_set_bgr(m_png);
+  png_set_interlace_handling(m_png);
+  png_read_update_info(m_png, m_info);
+  return true;
+}
+
+bool PngFile::ReadRows(png_bytepp rows) {
+  if (setjmp(png_jmpbuf(m_png)) != 0) {
+    return false;
+  }
+  png_read_image(m_png, rows);
+  png_read_end(m_png, nullptr);
+  return true;
+}
+
+/// Formats the image as the file says.
+void Format(const PngFile& png, std::uintmax_t fileSize, dImage& image) {
+  if (png.RowBytes() * png.Height() / kLargestExpansion > fileSize) {
+    throw Error("it is too short for its size");
+  }
+  const int channels = png.Channels();
   const char* const sequence = channels == 1 ? "G" : channels == 3 ? "BGR" : "BGRA";
-  if (!reading.image->Init(png_get_image_width(png, info), height, ImageDataType_U8, sequence,
-                           ImageDataOrder_Pixel, 4) ||
-      !reading.image->Fill(0)) {
-    reading.problem = "no memory for the picture";
-    return false;
+  if (!image.Init(png.Width(), png.Height(), ImageDataType_U8, sequence, ImageDataOrder_Pixel, 4) ||
+      !image.Fill(0)) {
+    throw Error("no memory for the picture");
   }
-  for (unsigned long y = 0; y < height; ++y) {
-    reading.rows.push_back(static_cast<png_bytep>(reading.image->GetRowPtr(static_cast<int>(y))));
-  }
-  return true;
 }
 
-/// Everything that may be jumped out of: only trivial objects live here.
-bool ReadImage(PngReading& reading) {
-  png_structp png = png_create_read_struct(PNG_LIBPNG_VER_STRING, &reading, OnError, OnWarning);
-  png_infop info = png != nullptr ? png_create_info_struct(png) : nullptr;
-  if (info == nullptr || setjmp(png_jmpbuf(png)) != 0) {
-    png_destroy_read_struct(&png, &info, nullptr);
-    return false;
+void Read(std::ifstream& file, std::uintmax_t fileSize, dImage& image) {
+  PngFile png(file);
+  if (!png.ReadHeader()) {
+    throw Error(png.Problem());
   }
-  png_init_io(png, reading.file);
-  png_read_info(png, info);
-  if (png_get_bit_depth(png, info) == 16) {
-    png_error(png, "it has 16 bits per sample, 8 are the most");
+  Format(png, fileSize, image);
+  std::vector<png_bytep> rows;
+  for (unsigned long y = 0; y < image.GetHeight(); ++y) {
+    rows.push_back(static_cast<png_bytep>(image.GetRowPtr(static_cast<int>(y))));
   }
-  png_set_expand(png);  // palettes to colours, fewer bits to 8, a transparent colour to a channel
-  if ((png_get_color_type(png, info) & PNG_COLOR_MASK_COLOR) == 0 &&
-      ((png_get_color_type(png, info) & PNG_COLOR_MASK_ALPHA) != 0 ||
-       png_get_valid(png, info, PNG_INFO_tRNS) != 0)) {
-    png_set_gray_to_rgb(png);  // grey with transparency has no layout of its own
+  if (!png.ReadRows(rows.data())) {
+    throw Error(png.Problem());
   }
-  png_set_bgr(png);
-  png_set_interlace_handling(png);
-  png_read_update_info(png, info);
-  if (!MakeRows(reading, png, info)) {
-    png_destroy_read_struct(&png, &info, nullptr);
-    return false;
-  }
-  png_read_image(png, reading.rows.data());
-  png_read_end(png, nullptr);
-  png_destroy_read_struct(&png, &info, nullptr);
-  return true;
 }
 
 }  // namespace
 
 void LoadPng(const std::filesystem::path& path, dImage& image) {
-  std::error_code error;
-  if (!std::filesystem::is_regular_file(path, error)) {
-    throw Error("can't read " + Quoted(path.string()) + ": there is no such file");
-  }
-  PngReading reading;
-  reading.fileSize = std::filesystem::file_size(path, error);
-  const std::unique_ptr<std::FILE, CloseFile> file(std::fopen(path.string().c_str(), "rb"));
-  if (file == nullptr) {
-    throw Error("can't read " + Quoted(path.string()) + ": it can't be opened");
-  }
-  reading.file = file.get();
-  reading.image = &image;
-  if (!ReadImage(reading)) {
+  try {
+    std::error_code error;
+    if (!std::filesystem::is_regular_file(path, error)) {
+      throw Error("there is no such file");
+    }
+    std::ifstream file(path, std::ios::binary);
+    if (!file) {
+      throw Error("it can't be opened");
+    }
+    Read(file, std::filesystem::file_size(path, error), image);
+  } catch (const Error& error) {
     image.Reset();
-    throw Error("can't read " + Quoted(path.string()) + ": " +
-                (reading.problem.empty() ? "no memory" : reading.problem));
+    throw Error("can't read " + Quoted(path.string()) + ": " + error.what());
   }
 }
 

@@ -2,7 +2,9 @@
 #include <vorl/IO/File/opDIB2Ima.h>
 
 #include <filesystem>
+#include <random>
 #include <string>
+#include <system_error>
 
 #include "../Fixtures.h"
 
@@ -14,9 +16,25 @@ long Edge() {
   return static_cast<long>(bench::Shrunk(kEdge));
 }
 
-std::string FileName() {
-  return (std::filesystem::temp_directory_path() / "vorl_bench.bmp").string();
-}
+/// The name of a file that no other run uses; what is written there is removed at the end.
+class ScratchFile {
+ public:
+  ScratchFile()
+      : m_path((std::filesystem::temp_directory_path() /
+                (std::string("vorl_bench_") + std::to_string(std::random_device()()) + ".bmp"))
+                   .string()) {}
+  ScratchFile(const ScratchFile&) = delete;
+  ScratchFile& operator=(const ScratchFile&) = delete;
+  ~ScratchFile() {
+    std::error_code ignored;
+    std::filesystem::remove(m_path, ignored);
+  }
+
+  const char* Name() const { return m_path.c_str(); }
+
+ private:
+  std::string m_path;
+};
 
 void ReportPixels(benchmark::State& state, const dImage& image) {
   bench::Report(state, image.GetWidth() * image.GetHeight(), image.GetImageSize());
@@ -44,33 +62,33 @@ void CreateSmall(benchmark::State& state) {
 }
 
 void Save(benchmark::State& state) {
+  const ScratchFile file;
   dDIB dib(Edge(), Edge(), 3, 8);
   bench::Fill(dib);
   for (auto _ : state) {
-    if (!dib.Save(FileName().c_str(), true)) {
+    if (!dib.Save(file.Name(), true)) {
       state.SkipWithError(static_cast<const char*>(dib.GetStatus()));
       return;
     }
   }
   ReportPixels(state, dib);
-  std::filesystem::remove(FileName());
 }
 
 // `target` is formatted once: later loads reuse its pixels if it is a plain image.
 void Load(benchmark::State& state, dImage& target, short channels) {
+  const ScratchFile file;
   dDIB dib(Edge(), Edge(), channels, 8);
   bench::Fill(dib);
-  dib.Save(FileName().c_str(), true);
+  dib.Save(file.Name(), true);
   opDIB2Ima reader;
   for (auto _ : state) {
-    if (!reader.Convert(FileName().c_str(), target)) {
+    if (!reader.Convert(file.Name(), target)) {
       state.SkipWithError(static_cast<const char*>(reader.GetStatus()));
       return;
     }
     benchmark::ClobberMemory();
   }
   ReportPixels(state, target);
-  std::filesystem::remove(FileName());
 }
 
 void LoadImage24(benchmark::State& state) {

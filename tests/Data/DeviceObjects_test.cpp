@@ -93,4 +93,28 @@ TEST_F(DeviceObjects, TransparentDrawingKeepsTwoBitmapsUntilItEnds) {
   DeleteDC(dc);
 }
 
+class OpenRenderer : public vIma2Device {
+ public:
+  using vIma2Device::CreateMask;
+};
+
+TEST_F(DeviceObjects, MaskThatIsMadeAnewReplacesTheOldOne) {
+  dImage image;
+  ASSERT_TRUE(image.Init(4, 4, ImageDataType_U8, "BGR", 0, 4));
+  dDIB screen(8, 8, 3, 8);
+  const HDC dc = CreateCompatibleDC(nullptr);
+  const HGDIOBJ old = SelectObject(dc, screen.GetHandle());
+  {
+    OpenRenderer renderer;
+    ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
+    renderer.EnableTransparency(0UL);
+    const std::size_t before = Count();
+    EXPECT_TRUE(renderer.CreateMask(dc));
+    EXPECT_TRUE(renderer.CreateMask(dc));
+    EXPECT_EQ(Count(), before + 2);
+  }
+  SelectObject(dc, old);
+  DeleteDC(dc);
+}
+
 }  // namespace

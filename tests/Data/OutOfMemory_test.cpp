@@ -8,6 +8,9 @@
 #include <vorl/Operators/IP/opMPR.h>
 
 #include <string>
+#include <vector>
+
+#include "../Support/LogRecorder.h"
 
 namespace {
 
@@ -91,6 +94,25 @@ TEST(DataOutOfMemory, BitmapCannotBeDescribed) {
     EXPECT_TRUE(descriptor.GetStatus() == -1);
     EXPECT_FALSE(dImaDescriptorDIB(good).IsValid());
   }
+}
+
+// Small things find memory: the text, for example.
+TEST(DataOutOfMemory, BitmapThatCannotBeDescribedTellsWhy) {
+  dImage image;
+  ASSERT_TRUE(image.Init(4, 4, ImageDataType_U8, "G", 0, 4));
+  dImaDescriptorDIB descriptor;
+  const dImaDescriptorDIB good(image);
+  const char* const text =
+      "unable to convert into 'Bitmap':\n\t no memory for 'BITMAPINFO' structure";
+  LogRecorder log;
+  {
+    const LargeAllocationFailure failure(1000);
+    EXPECT_EQ(descriptor.Init(image), nullptr);
+    EXPECT_STREQ(dImaDescriptorDIB(good).GetStatus(), text);
+  }
+  EXPECT_STREQ(descriptor.GetStatus(), text);
+  EXPECT_EQ(log.errors, std::vector<std::string>{std::string("dImaDescriptorDIB::Init: ") + text});
+  EXPECT_EQ(descriptor.GetHeader(), nullptr);
 }
 
 TEST(DataOutOfMemory, SectionCannotBeCreated) {

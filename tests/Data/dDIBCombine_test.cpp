@@ -66,6 +66,15 @@ TEST(dDIBCombine, BitmapCanBeDrawnIntoItself) {
   EXPECT_EQ(std::memcmp(dib.GetDataPtr(), "abcd", 4), 0);
 }
 
+TEST(dDIBCombine, SourceMayBeSelectedElsewhere) {
+  dDIB target(2, 1, 1, 8);
+  dDIB source(2, 1, 1, 8);
+  source.Fill(0x35);
+  const SelectedBitmap elsewhere(source.GetHandle());
+  ASSERT_TRUE(target.Combine(source, 0, 0, static_cast<int>(SRCCOPY)));
+  EXPECT_EQ(Byte(target, 1, 0, 0), 0x35);
+}
+
 TEST(dDIBCombine, BothSectionsMustBeThere) {
   dDIB dib(4, 4, 1, 8);
   dDIB empty;
@@ -74,6 +83,8 @@ TEST(dDIBCombine, BothSectionsMustBeThere) {
   EXPECT_EQ(StatusText(empty), "Combine: missing target bitmap handle");
   EXPECT_FALSE(dib.Combine(empty, 0, 0, static_cast<int>(SRCCOPY)));
   EXPECT_EQ(StatusText(dib), "Combine: missing source bitmap handle");
+  EXPECT_TRUE(dib.Combine(dib, 0, 0, static_cast<int>(SRCCOPY)));
+  EXPECT_EQ(dib.GetStatus(), 0);
   EXPECT_EQ(log.errors,
             (std::vector<std::string>{"dDIB::Combine: Combine: missing target bitmap handle",
                                       "dDIB::Combine: Combine: missing source bitmap handle"}));

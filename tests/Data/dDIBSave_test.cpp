@@ -3,10 +3,12 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
+#include <cstddef>
 #include <filesystem>
+#include <iterator>
 #include <limits>
 #include <string>
+#include <utility>
 
 #if !defined(_WIN32)
 #include <sys/stat.h>
@@ -77,30 +79,52 @@ TEST_F(dDIBSave, BitmapWithoutPixelsIsNotSaved) {
 TEST_F(dDIBSave, FailureOfTheDescriptorIsTold) {
   dDIB dib(3, 2, 1, 8);
   ASSERT_TRUE(dib.Save("a.bmp", false));
+  LogRecorder log;
   EXPECT_FALSE(dib.Save("a.bmp", false));
   EXPECT_EQ(StatusText(dib), "dDIB::Save: error:file already exists:'a.bmp'");
   EXPECT_FALSE(dib.Save("", false));
   EXPECT_EQ(StatusText(dib), "dDIB::Save: error:NULL parameter:'FilePath'");
   EXPECT_TRUE(dib.IsValid());
+  EXPECT_EQ(log.errors.back(), "dDIB::Save: dDIB::Save: error:NULL parameter:'FilePath'");
   EXPECT_TRUE(dib.Save("a.bmp", true));
+  EXPECT_EQ(dib.GetStatus(), 0);
 }
 
-TEST_F(dDIBSave, UnnamedBitmapsAreNumberedThroughTheProcess) {
+/// Saves a bitmap without a name. Every such call of this program is made here, in whatever order
+/// the tests run: so the number of the file is known, and the first one is 1.
+void ExpectNumberedSave(dDIB& dib) {
+  static int count = 0;
+  const std::string name = std::string("DIBImage") + std::to_string(++count) + ".bmp";
+  ASSERT_FALSE(fs::exists(name));
+  EXPECT_TRUE(dib.Save(nullptr, false)) << dib.GetStatus();
+  EXPECT_TRUE(fs::exists(name)) << name;
+}
+
+TEST_F(dDIBSave, UnnamedBitmapsAreNumberedFromOneThroughTheProcess) {
   dDIB dib(3, 2, 1, 8);
-  ASSERT_TRUE(dib.Save(nullptr, false));
-  std::string first;
-  for (const auto& entry : fs::directory_iterator(".")) {
-    first = entry.path().filename().string();
-  }
-  ASSERT_EQ(first.substr(0, 8), "DIBImage");
-  const int number = std::atoi(first.c_str() + 8);
-  EXPECT_GE(number, 1);
-  EXPECT_EQ(first, "DIBImage" + std::to_string(number) + ".bmp");
   dDIB other(3, 2, 1, 8);
-  ASSERT_TRUE(other.Save(nullptr, false));
-  EXPECT_TRUE(fs::exists("DIBImage" + std::to_string(number + 1) + ".bmp"));
-  ASSERT_TRUE(dib.Save(nullptr, false));
-  EXPECT_TRUE(fs::exists("DIBImage" + std::to_string(number + 2) + ".bmp"));
+  ExpectNumberedSave(dib);
+  ExpectNumberedSave(other);
+  ExpectNumberedSave(dib);
+  EXPECT_EQ(std::distance(fs::directory_iterator("."), fs::directory_iterator()), 3);
+}
+
+TEST_F(dDIBSave, FormattingAnewForgetsTheName) {
+  dDIB dib(3, 2, 1, 8);
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  dDIB read("a.bmp");
+  fs::remove("a.bmp");
+  const tagBITMAPINFO info{{40, 4, 4, 1, 24, 0, 0, 0, 0, 0, 0}, {}};
+  const unsigned char bits[48] = {};
+  ASSERT_TRUE(read.Init(&info, bits));
+  ExpectNumberedSave(read);
+  ASSERT_TRUE(dib.Save("a.bmp", false));
+  ASSERT_TRUE(read.Init("a.bmp"));
+  fs::remove("a.bmp");
+  read.Reset();
+  ASSERT_TRUE(read.Init(3, 2, 3, 8));
+  ExpectNumberedSave(read);
+  EXPECT_FALSE(fs::exists("a.bmp"));
 }
 
 TEST_F(dDIBSave, BitmapFromAFileIsSavedUnderItsName) {
@@ -129,7 +153,7 @@ TEST_F(dDIBSave, NameMovesWithTheSection) {
   NamedBitmap unnamed(3, 2, 1, 8);
   unnamed.SetFileName("other.bmp");
   unnamed.SetFileName(nullptr);
-  ASSERT_TRUE(unnamed.Save(nullptr, false));
+  ExpectNumberedSave(unnamed);
   EXPECT_FALSE(fs::exists("other.bmp"));
 }
 
@@ -170,6 +194,21 @@ TEST_F(IsBitmapFile, TellsTheSizeWithoutSigns) {
   EXPECT_EQ(m_height, 5);
 }
 
+// Four bytes more than the header are asked for; that they are there is not.
+TEST_F(IsBitmapFile, FileMayEndRightBehindItsHeader) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = 7;
+  bitmap.height = 5;
+  bitmap.bits = 24;
+  const auto whole = bitmap_test::FileOf(bitmap);
+  for (const long bytes : {40, 41, 42, 43, 44}) {
+    MakeFile({whole.begin(), whole.begin() + 14 + bytes});
+    EXPECT_TRUE(Ask(FileName())) << bytes;
+    EXPECT_EQ(m_width, 7) << bytes;
+    EXPECT_EQ(m_height, 5) << bytes;
+  }
+}
+
 TEST_F(IsBitmapFile, HeadersOfAllKindsTellTheirSize) {
   bitmap_test::Bitmap bitmap;
   bitmap.width = 7;
@@ -185,6 +224,37 @@ TEST_F(IsBitmapFile, HeadersOfAllKindsTellTheirSize) {
   EXPECT_TRUE(Ask(FileName()));
   EXPECT_EQ(m_width, 265);
   EXPECT_EQ(m_height, 6);
+}
+
+TEST_F(IsBitmapFile, OldHeaderMustBeThereToo) {
+  const Bytes whole{'B', 'M', 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0,
+                    0,   12,  0, 0, 0, 9, 1, 6, 0, 1, 0, 8, 0};
+  MakeFile({whole.begin(), whole.end() - 1});
+  ExpectNot(FileName());
+}
+
+/// The number of files that the process has open; 0 where that cannot be asked.
+std::ptrdiff_t OpenFiles() {
+#if defined(__linux__)
+  return std::distance(fs::directory_iterator("/proc/self/fd"), fs::directory_iterator());
+#else
+  return 0;
+#endif
+}
+
+TEST_F(IsBitmapFile, FileIsClosedAgain) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = 7;
+  bitmap.height = 5;
+  bitmap.bits = 24;
+  const auto good = bitmap_test::FileOf(bitmap);
+  for (const Bytes& bytes : {Bytes{good.begin(), good.end()}, Bytes{'B', 'M'}}) {
+    MakeFile(bytes);
+    const auto before = OpenFiles();
+    Ask(FileName());
+    EXPECT_EQ(OpenFiles(), before);
+    EXPECT_TRUE(fs::remove(FileName()));  // not every system removes what is open
+  }
 }
 
 TEST_F(IsBitmapFile, NameMustBeGiven) {
@@ -229,7 +299,10 @@ TEST_F(IsBitmapFile, OtherFilesAreToldAsInformation) {
   bitmap.width = std::numeric_limits<std::int32_t>::min();
   bitmap.rows = {0};
   std::vector<Bytes> files{
-      {}, {'B', 'M'}, {whole.begin(), whole.begin() + 53}, bitmap_test::FileOf(bitmap), whole};
+      {}, {'B', 'M'}, {whole.begin(), whole.begin() + 53}, bitmap_test::FileOf(bitmap)};
+  std::swap(bitmap.width, bitmap.height);
+  files.push_back(bitmap_test::FileOf(bitmap));
+  files.push_back(whole);
   files.back()[0] = 'A';
   for (const Bytes& bytes : files) {
     MakeFile(bytes);

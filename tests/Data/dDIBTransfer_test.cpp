@@ -6,6 +6,7 @@
 #include <cstring>
 #include <utility>
 
+#include "../Support/LogRecorder.h"
 #include "DibTesting.h"
 
 namespace {
@@ -253,10 +254,12 @@ TEST(dDIBTransfer, InvalidSourceIsRefused) {
   for (const DataTransferMode mode : {DTM_Copy, DTM_TakeOver, DTM_Reference}) {
     dDIB empty;
     dDIB dib(4, 4, 1, 8);
+    LogRecorder log;
     EXPECT_FALSE(dib.Init(mode, empty));
     EXPECT_FALSE(dib.IsValid());
     EXPECT_EQ(dib.GetHandle(), nullptr);
     EXPECT_EQ(StatusText(dib), "initialization error:uninitialized image") << mode;
+    EXPECT_EQ(log.errors.back(), "dDIB::OnInit: initialization error:uninitialized image") << mode;
   }
 }
 

@@ -138,8 +138,12 @@ TEST(dDIB, FormatsOfNoBitmapAreRefused) {
       {0xFFFFFFFF, 8, "BGR", 0, "no memory(25769803776 bytes required)"}};
   for (const auto& one : kCases) {
     dDIB dib(4, 4, 1, 8);
+    LogRecorder log;
     EXPECT_FALSE(dib.Init(one.width, 2UL, one.dataType, one.sequence, one.order, 4));
     EXPECT_EQ(StatusText(dib), one.text);
+    const bool isRefusedByDescriptor = std::string(one.text).rfind("initialization error:", 0) == 0;
+    EXPECT_EQ(log.errors.back(),
+              std::string(isRefusedByDescriptor ? "dDIB::Init: " : "dImage::Init: ") + one.text);
     EXPECT_FALSE(dib.IsValid());
     EXPECT_EQ(dib.GetHandle(), nullptr);
     EXPECT_EQ(dib.GetHeader(), nullptr);
@@ -219,6 +223,12 @@ TEST(dDIB, BlockThatCannotBeReadTellsWhy) {
   EXPECT_FALSE(dib.IsValid());
   EXPECT_FALSE(dib.Init(nullptr, bits));
   EXPECT_EQ(StatusText(dib), "initialization error:no bitmap information block specified");
+  LogRecorder log;
+  EXPECT_FALSE(dib.Init(&info, nullptr));
+  EXPECT_EQ(StatusText(dib), "initialization error:no pixel bits specified");
+  EXPECT_EQ(log.errors,
+            (std::vector<std::string>{"opDIB2Ima::Convert: no pixel bits specified",
+                                      "dDIB::Init: initialization error:no pixel bits specified"}));
 }
 
 class dDIBFile : public BinaryFileTest {};

@@ -83,6 +83,36 @@ TEST_F(dImaDescriptorDIBFile, SavingLeavesTheBlockAsItWas) {
   EXPECT_EQ(descriptor.GetHeader()->bmiHeader.biHeight, -2);
 }
 
+TEST_F(dImaDescriptorDIBFile, CopySavesTheSameFile) {
+  dImage image = MakeImage(3, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  ASSERT_TRUE(descriptor.Save(m_path.c_str(), false));
+  const auto bytes = FileBytes();
+  dImaDescriptorDIB copy(descriptor);
+  ASSERT_TRUE(copy.Save(m_path.c_str(), true)) << copy.GetStatus();
+  EXPECT_EQ(FileBytes(), bytes);
+}
+
+TEST_F(dImaDescriptorDIBFile, SuccessClearsAnOldFailure) {
+  dImage image = MakeImage(3, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  ASSERT_TRUE(descriptor.Save(m_path.c_str(), false));
+  EXPECT_FALSE(descriptor.Save(m_path.c_str(), false));
+  EXPECT_EQ(descriptor.GetStatus(), -1);
+  EXPECT_TRUE(descriptor.Save(m_path.c_str(), true));
+  EXPECT_EQ(descriptor.GetStatus(), 0);
+}
+
+TEST_F(dImaDescriptorDIBFile, MoreBytesThanAFileHeaderCanStateAreNotWritten) {
+  ClaimingImage image(0x7FFFFFF0, 2, ImageDataType_U8);
+  dImaDescriptorDIB descriptor(image);
+  ASSERT_TRUE(descriptor.IsValid()) << descriptor.GetStatus();
+  EXPECT_FALSE(descriptor.Save(m_path.c_str(), false));
+  EXPECT_STREQ(descriptor.GetStatus(),
+               ("error while writing file header to '" + m_path + "'").c_str());
+  EXPECT_FALSE(fs::exists(m_path));
+}
+
 TEST_F(dImaDescriptorDIBFile, SavesATwentyFourBitImageWithoutColourTable) {
   dImage image = MakeImage(10, 2, ImageDataType_U8, "BGR");
   dImaDescriptorDIB descriptor(image);

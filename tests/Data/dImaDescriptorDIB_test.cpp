@@ -157,6 +157,27 @@ TEST(dImaDescriptorDIB, RefusesRowsThatAreNotAMultipleOfFourBytes) {
   EXPECT_FALSE(descriptor.IsValid());
 }
 
+TEST(dImaDescriptorDIB, RowsAreLookedAtBeforeTheLayout) {
+  dImage image = MakeImage(3, 2, ImageDataType_U16, "G", 2);
+  dImaDescriptorDIB descriptor(image);
+  EXPECT_STREQ(descriptor.GetStatus(), "image rows are not 4 byte aligned");
+}
+
+TEST(dImaDescriptorDIB, ResetForgetsTheImage) {
+  dImage image = MakeImage(4, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  EXPECT_TRUE(descriptor.IsCurrent());
+  descriptor.Reset();
+  EXPECT_FALSE(descriptor.IsValid());
+  EXPECT_FALSE(descriptor.IsCurrent());
+  EXPECT_EQ(descriptor.GetHeader(), nullptr);
+  EXPECT_EQ(descriptor.GetPixelData(), nullptr);
+  EXPECT_EQ(descriptor.GetPalette(), nullptr);
+  EXPECT_EQ(descriptor.GetPaletteSize(), 0);
+  EXPECT_FALSE(descriptor.ResetPalette(true));
+  EXPECT_TRUE(image.IsValid());
+}
+
 TEST(dImaDescriptorDIB, RefusesOtherLayoutsByName) {
   const auto reasonFor = [](unsigned short type, const char* sequence, unsigned short order) {
     dImage image;
@@ -170,6 +191,57 @@ TEST(dImaDescriptorDIB, RefusesOtherLayoutsByName) {
   EXPECT_EQ(reasonFor(8, "GA", 0), "not a 'Bitmap' format: 2 x 8 bit - 'GA' - pixel order");
   EXPECT_EQ(reasonFor(16, "G", 0), "not a 'Bitmap' format: 1 x 16 bit - 'G' - pixel order");
   EXPECT_EQ(reasonFor(0x1008, "G", 0), "not a 'Bitmap' format: 1 x 4104 bit - 'G' - pixel order");
+}
+
+TEST(dImaDescriptorDIB, RefusesRowsOfMorePixelsThanAHeaderCanState) {
+  ClaimingImage widest(0x7FFFFFE0, 1, ImageDataType_U1);
+  dImaDescriptorDIB descriptor;
+  const tagBITMAPINFO* const block = descriptor.Init(widest);
+  ASSERT_NE(block, nullptr);
+  EXPECT_EQ(block->bmiHeader.biWidth, 0x7FFFFFE0);
+  ClaimingImage wider(0x80000000, 1, ImageDataType_U1);
+  EXPECT_EQ(descriptor.Init(wider), nullptr);
+  EXPECT_STREQ(descriptor.GetStatus(), "not a 'Bitmap' format: 1 x 1 bit - 'G' - pixel order");
+}
+
+TEST(dImaDescriptorDIB, KnowsWhenItsImageIsAnother) {
+  dImage image = MakeImage(3, 2, ImageDataType_U8, "G");
+  dImaDescriptorDIB descriptor(image);
+  EXPECT_TRUE(descriptor.IsCurrent());
+  ASSERT_TRUE(image.Init(2, 2, ImageDataType_U8, "G", ImageDataOrder_Pixel, 4));
+  EXPECT_EQ(image.GetDataPtr(), descriptor.GetPixelData()) << "the same pixels, fewer of a row";
+  EXPECT_FALSE(descriptor.IsCurrent());
+  ASSERT_TRUE(image.Init(3, 2, ImageDataType_U8, "G", ImageDataOrder_Pixel, 4));
+  EXPECT_TRUE(descriptor.IsCurrent());
+  dImage other = MakeImage(3, 2, ImageDataType_U8, "G");
+  image <<= other;
+  EXPECT_NE(image.GetDataPtr(), descriptor.GetPixelData());
+  EXPECT_FALSE(descriptor.IsCurrent());
+}
+
+TEST(dImaDescriptorDIB, BlockThatWasWrittenIntoIsNotCurrent) {
+  dImage image = MakeImage(3, 2, ImageDataType_U8, "G", 32);
+  dImaDescriptorDIB descriptor(image);
+  const BITMAPINFOHEADER header = descriptor.GetHeader()->bmiHeader;
+  BITMAPINFOHEADER& changed = descriptor.GetHeader()->bmiHeader;
+  changed.biSize = 108;
+  EXPECT_FALSE(descriptor.IsCurrent());
+  changed = header;
+  changed.biCompression = 1;
+  EXPECT_FALSE(descriptor.IsCurrent());
+  changed = header;
+  changed.biHeight = -1;  // fewer rows
+  EXPECT_FALSE(descriptor.IsCurrent());
+  changed = header;
+  changed.biWidth = 4;  // shorter rows
+  EXPECT_FALSE(descriptor.IsCurrent());
+  changed = header;
+  changed.biBitCount = 4;  // the same rows, of pixels that are others
+  changed.biWidth = 64;
+  EXPECT_FALSE(descriptor.IsCurrent());
+  changed = header;
+  changed.biHeight = 2;  // upside down: still the image's rows
+  EXPECT_TRUE(descriptor.IsCurrent());
 }
 
 TEST(dImaDescriptorDIB, FailedInitForgetsTheImageDescribedBefore) {

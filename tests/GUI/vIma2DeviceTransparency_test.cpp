@@ -107,6 +107,13 @@ TEST_P(vIma2DeviceTransparency, PixelOutsideTheImageStandsForBlack) {
 INSTANTIATE_TEST_SUITE_P(All, vIma2DeviceTransparency, testing::Values("G", "BGR", "BGRA"),
                          [](const auto& test) { return std::string(test.param); });
 
+class OpenRenderer : public vIma2Device {
+ public:
+  using vIma2Device::CreateMask;
+  using vIma2Device::DrawTransparent;
+  using vIma2Device::ResetTransparency;
+};
+
 TEST(vIma2DeviceTransparent, OneBitImageCanBeAStencil) {
   dImage image = NumberedImage(6, 4, 1, "G");
   const tagRECT target{1, 2, 7, 6};
@@ -149,6 +156,116 @@ TEST(vIma2DeviceTransparent, SettingOutlivesTheImage) {
   ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
 }
 
+TEST(vIma2DeviceTransparent, PixelOutlivesTheImageToo) {
+  dImage first = NumberedImage(6, 4, 8, "BGR");
+  dImage image = Pattern("BGR");
+  const tagRECT target{1, 2, 7, 6};
+  vIma2Device renderer;
+  renderer.EnableTransparency(1, 0);  // of the pattern's second colour
+  Canvas canvas(10, 8);
+  ASSERT_TRUE(renderer.Init(&first, nullptr, &target, false, false));
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+}
+
+TEST(vIma2DeviceTransparent, NewPixelsAreLookedAtWhenTheTransparencyIsSetAnew) {
+  dImage image = Pattern("BGR");
+  const tagRECT target{1, 2, 7, 6};
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+  Canvas canvas(10, 8);
+  for (const unsigned colour : {0xE0E0E0U, PixelOf(image, 0, 0), PixelOf(image, 5, 3)}) {
+    renderer.EnableTransparency(static_cast<unsigned long>(colour));
+    canvas.Fill(0x55);
+    ASSERT_TRUE(renderer.Draw(canvas));
+    ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, colour);
+  }
+}
+
+TEST(vIma2DeviceTransparent, BitmapsAreMadeOnceForAnImage) {
+  dImage image = Pattern("BGR");
+  const dImage before(image);
+  const tagRECT target{1, 2, 7, 6};
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+  renderer.EnableTransparency(0xE0E0E0UL);
+  Canvas canvas(10, 8);
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  image.Fill(0x11);
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));  // what the image was
+  ExpectPicture(canvas, before, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+  image = Pattern("G");  // formatted anew: what it is
+  canvas.Fill(0x55);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+}
+
+TEST(vIma2DeviceTransparent, CopyLooksAtTheSamePixel) {
+  dImage image = Pattern("BGR");
+  const tagRECT source{0, 0, 6, 3};
+  const tagRECT target{1, 2, 7, 5};
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, &source, &target, false, true));
+  renderer.EnableTransparency(5, 2);
+  const vIma2Device first(renderer);
+  vIma2Device copy(first);
+  Canvas canvas(10, 8);
+  Canvas other(10, 8);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  ASSERT_TRUE(copy.Draw(other));
+  for (int y = 0; y < 8; ++y) {
+    for (int x = 0; x < 10; ++x) {
+      EXPECT_EQ(other.At(x, y), canvas.At(x, y)) << x << ", " << y;
+    }
+  }
+}
+
+TEST(vIma2DeviceTransparent, ModeForgetsTheSettingOfTheOther) {
+  dImage image = Pattern("G");
+  *static_cast<unsigned char*>(image.GetDataPtr(3, 2)) = 0;
+  const tagRECT target{1, 2, 7, 6};
+  OpenRenderer renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+  const auto draw = [&](unsigned transparent) {
+    Canvas canvas(10, 8);
+    canvas.Fill(0x55);
+    ASSERT_TRUE(renderer.Draw(canvas));
+    ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, transparent);
+  };
+  renderer.EnableTransparency(0xE0E0E0UL);
+  renderer.ResetTransparency(Transparency_Color);  // keeps the colour
+  draw(0xE0E0E0);
+  renderer.ResetTransparency(Transparency_None);
+  renderer.ResetTransparency(Transparency_Color);  // black
+  draw(0);
+  renderer.EnableTransparency(5, 3);
+  renderer.ResetTransparency(Transparency_Pixel);  // keeps the position
+  draw(PixelOf(image, 5, 3));
+  renderer.ResetTransparency(Transparency_Color);  // keeps the colour that was found
+  draw(PixelOf(image, 5, 3));
+  renderer.ResetTransparency(Transparency_Pixel);  // the first pixel
+  draw(PixelOf(image, 0, 0));
+}
+
+TEST(vIma2DeviceTransparent, StretchModeIsTheCallers) {
+  dImage image = Pattern("BGR");
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
+  Canvas canvas(10, 8);
+  SetStretchBltMode(canvas, WHITEONBLACK);
+  renderer.EnableTransparency(0xE0E0E0UL);
+  ASSERT_TRUE(renderer.Draw(canvas));
+  EXPECT_EQ(SetStretchBltMode(canvas, WHITEONBLACK), WHITEONBLACK);
+  renderer.DisableTransparency();
+  ASSERT_TRUE(renderer.Draw(canvas));
+  EXPECT_EQ(SetStretchBltMode(canvas, WHITEONBLACK), COLORONCOLOR);
+}
+
 TEST(vIma2DeviceTransparent, DevicesColoursAreRestored) {
   dImage image = Pattern("BGR");
   const tagRECT target{1, 2, 7, 6};
@@ -164,12 +281,6 @@ TEST(vIma2DeviceTransparent, DevicesColoursAreRestored) {
   EXPECT_EQ(SetTextColor(canvas, 0), 0x445566U);
   ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
 }
-
-class OpenRenderer : public vIma2Device {
- public:
-  using vIma2Device::CreateMask;
-  using vIma2Device::DrawTransparent;
-};
 
 TEST(vIma2DeviceTransparent, NothingIsDrawnWithoutAnImage) {
   OpenRenderer renderer;

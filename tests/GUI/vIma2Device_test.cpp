@@ -89,13 +89,14 @@ TEST(vIma2Device, RectanglesMayBeItsOwn) {
 }
 
 TEST(vIma2Device, NoImageIsNoFailureButNothingToDraw) {
-  dImage image = NumberedImage(5, 3, 8, "BGR");
+  dImage image = NumberedImage(5, 3, 8, "G");
   const tagRECT rect{1, 2, 3, 4};
   vIma2Device renderer;
   Canvas canvas(4, 4);
   ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
   EXPECT_TRUE(renderer.Init(nullptr, &rect, &rect, true, true));
   EXPECT_EQ(renderer.GetStatus(), 0);
+  EXPECT_EQ(renderer.GetPaletteSize(), 0);
   EXPECT_EQ(RectText(*renderer.GetImageRect()), kNoRect);
   EXPECT_EQ(RectText(*renderer.GetSourceRect()), kNoRect);
   EXPECT_EQ(RectText(*renderer.GetTargetRect()), kNoRect);
@@ -253,6 +254,25 @@ TEST(vIma2Device, CopyDrawsTheSameImage) {
   }
 }
 
+TEST(vIma2Device, CopyKeepsHowToDraw) {
+  dImage image = NumberedImage(4, 2, 8, "G");
+  vIma2Device renderer;
+  ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, true, true));
+  EXPECT_FALSE(renderer.EraseBackground(nullptr, nullptr, nullptr, 0));
+  vIma2Device copy(renderer);
+  EXPECT_EQ(StatusText(copy), "EraseBackground: no region specified");
+  const tagRECT square{0, 0, 4, 4};
+  ASSERT_TRUE(copy.SetTargetRect(&square));
+  EXPECT_EQ(RectText(*copy.GetTargetRect()), "0 1 4 3") << "it is fitted";
+  image = NumberedImage(5, 2, 8, "G");  // described anew: still upside down
+  ASSERT_TRUE(copy.SetSourceRect(nullptr));
+  ASSERT_TRUE(copy.SetTargetRect(nullptr));
+  Canvas canvas(5, 2);
+  ASSERT_TRUE(copy.Draw(canvas));
+  EXPECT_EQ(canvas.At(4, 0), PixelOf(image, 4, 1));
+  EXPECT_EQ(canvas.At(4, 1), PixelOf(image, 4, 0));
+}
+
 TEST(vIma2Device, IsRegisteredUnderBaseClass) {
   EXPECT_STREQ(vIma2Device::CI().name, "vIma2Device");
   EXPECT_EQ(vIma2Device::CI().parents[0], &BaseClass::CI());
@@ -345,6 +365,13 @@ TEST(vIma2DeviceErase, DeviceThatIsNoneFails) {
   vIma2Device renderer;
   const tagRECT region{0, 0, 6, 4};
   EXPECT_FALSE(renderer.EraseBackground(nullptr, &region, nullptr, kColour));
+#if !defined(_WIN32)  // not every system tells of a device that is gone
+  const tagRECT excluded{1, 1, 2, 2};
+  const HDC dc = CreateCompatibleDC(nullptr);
+  DeleteDC(dc);
+  EXPECT_FALSE(renderer.EraseBackground(dc, &region, nullptr, kColour));
+  EXPECT_FALSE(renderer.EraseBackground(dc, &region, &excluded, kColour));
+#endif
 }
 
 }  // namespace

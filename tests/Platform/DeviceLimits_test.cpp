@@ -53,6 +53,15 @@ TEST(DeviceLimits, NullBitsOfASectionAreFine) {
   EXPECT_TRUE(DeleteObject(bitmap));
 }
 
+TEST(DeviceLimits, SectionsOfOthersMemoryAreRefused) {
+  TestInfo info(4, 4, 32);
+  void* bits = &info;
+  int handle = 0;
+  EXPECT_EQ(CreateDIBSection(nullptr, info.Get(), DIB_RGB_COLORS, &bits, &handle, 0), nullptr);
+  EXPECT_EQ(bits, nullptr);
+  EXPECT_EQ(GetLastError(), ERROR_INVALID_PARAMETER);
+}
+
 TEST(DeviceLimits, ColourIndicesInsteadOfColoursAreRefused) {
   TestInfo info(4, 4, 8);
   std::uint8_t bits[16]{};

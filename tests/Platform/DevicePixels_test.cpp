@@ -195,6 +195,24 @@ TEST(DevicePixels, MirroredAndCroppedStretchesKeepTheirGeometry) {
   }
 }
 
+TEST(DevicePixels, HalftoneWorksLikeColourOnColour) {
+  TestSection source(9, 7, 8);
+  for (std::size_t i = 0; i < source.Bytes(); ++i) {
+    source.pixels[i] = static_cast<std::uint8_t>(i * 37 + 11);
+  }
+  for (const int width : {3, 20}) {
+    const TestSection halftone(20, 20, 32);
+    const TestSection colours(20, 20, 32);
+    EXPECT_EQ(SetStretchBltMode(halftone.dc, HALFTONE), BLACKONWHITE);
+    EXPECT_EQ(SetStretchBltMode(colours.dc, COLORONCOLOR), BLACKONWHITE);
+    for (const TestSection* section : {&halftone, &colours}) {
+      EXPECT_TRUE(StretchBlt(section->dc, 0, 0, width, width, source.dc, 0, 0, 9, 7, SRCCOPY));
+    }
+    EXPECT_EQ(std::memcmp(halftone.pixels, colours.pixels, colours.Bytes()), 0) << width;
+    EXPECT_EQ(SetStretchBltMode(halftone.dc, COLORONCOLOR), HALFTONE);
+  }
+}
+
 TEST(DevicePixels, MasksOfSixteenBits) {
   TestInfo info(2, -1, 16);
   info.header.biCompression = BI_BITFIELDS;

@@ -48,7 +48,7 @@ std::u32string TextOf(const TextLine& line) {
 // The texts of the lines; `limit` in widths of "m".
 std::vector<std::u32string> Lines(const std::u32string& text, UINT format, int limit = 0) {
   const auto font = FontFace::Find(Description(-20));
-  const std::int64_t width = std::int64_t{limit} * font->GlyphOf(U'm').advance;
+  const std::int64_t width = std::int64_t{limit} * font->GlyphOf(U'm')->advance;
   std::vector<std::u32string> lines;
   for (const TextLine& line : LayOutText(text, *font, TextFormat(format), width)) {
     lines.push_back(TextOf(line));
@@ -117,6 +117,26 @@ TEST(DeviceText, AmpersandsUnderlineTheLastLetterMarked) {
   EXPECT_EQ(Lines(U"&a", DT_NOPREFIX), Texts{U"&a"});
 }
 
+TEST(DeviceText, UnderlinedLetterHasALineOneShorterThanItself) {
+  TestSection s(60, -60, 32);
+  SetBkMode(s.dc, TRANSPARENT);
+  SetTextColor(s.dc, RGB(255, 255, 255));
+  const HFONT selected = CreateFontA(-30, 0, 0, 0, FW_NORMAL, 0, 0, 0, 1, 0, 0, 0, 0, "");
+  const HGDIOBJ old = SelectObject(s.dc, selected);
+  RECT rect{5, 7, 60, 60};
+  DrawTextA(s.dc, "& ", -1, &rect, 0);
+  const auto font = FontFace::Find(Description(-30));
+  const int row = 7 + font->Metrics().ascent + 1;
+  const int end = 5 + font->GlyphOf(U' ')->advance - 1;
+  for (int y = 0; y < 60; ++y) {
+    for (int x = 0; x < 60; ++x) {
+      EXPECT_EQ((s.At(x, y) & 0xFFFFFFU) != 0, y == row && x >= 5 && x < end) << x << ", " << y;
+    }
+  }
+  SelectObject(s.dc, old);
+  DeleteObject(selected);
+}
+
 TEST(DeviceText, TabStopsMayBeGiven) {
   const auto font = FontFace::Find(Description(-20));
   const int average = font->Metrics().averageWidth;
@@ -164,9 +184,9 @@ TEST(DeviceText, RectanglesAtTheEndsOfThePlane) {
 
 TEST(DeviceText, MissingCharactersAreShownAsSuch) {
   const auto font = FontFace::Find(Description(-30));
-  const vorl_detail::Glyph& glyph = font->GlyphOf(0x10FFFD);  // for private use
-  EXPECT_GT(glyph.advance, 0);
-  EXPECT_EQ(glyph.coverage, font->GlyphOf(0x10FFFC).coverage);
+  const auto glyph = font->GlyphOf(0x10FFFD);  // for private use
+  EXPECT_GT(glyph->advance, 0);
+  EXPECT_EQ(glyph->coverage, font->GlyphOf(0x10FFFC)->coverage);
 }
 
 TEST(DeviceText, ALineOfPositiveHeightFits) {

@@ -3,22 +3,33 @@
 #include <chrono>
 #include <cstddef>
 #include <cstdlib>
+#include <limits>
 #include <new>
 #include <thread>
 
 namespace {
 
-thread_local bool failing = false;
+constexpr std::size_t kNever = std::numeric_limits<std::size_t>::max();
+
+thread_local std::size_t failingSize = kNever;  // from which on there is no memory
 thread_local int delay = 0;
 
 }  // namespace
 
 AllocationFailure::AllocationFailure() {
-  failing = true;
+  failingSize = 0;
 }
 
 AllocationFailure::~AllocationFailure() {
-  failing = false;
+  failingSize = kNever;
+}
+
+LargeAllocationFailure::LargeAllocationFailure(std::size_t bytes) {
+  failingSize = bytes;
+}
+
+LargeAllocationFailure::~LargeAllocationFailure() {
+  failingSize = kNever;
 }
 
 AllocationDelay::AllocationDelay(int milliseconds) {
@@ -33,7 +44,7 @@ void* operator new(std::size_t size) {
   if (delay > 0) {
     std::this_thread::sleep_for(std::chrono::milliseconds(delay));
   }
-  void* memory = failing ? nullptr : std::malloc(size != 0 ? size : 1);
+  void* memory = size >= failingSize ? nullptr : std::malloc(size != 0 ? size : 1);
   if (memory == nullptr) {
     throw std::bad_alloc();
   }

@@ -1,6 +1,8 @@
 #ifndef VORL_TESTS_SUPPORT_ALLOCATION_H
 #define VORL_TESTS_SUPPORT_ALLOCATION_H
 
+#include <cstddef>
+
 /// While one lives, `new` finds no memory in the thread that made it. Works in executables that
 /// link Allocation.cpp.
 class AllocationFailure {
@@ -9,6 +11,15 @@ class AllocationFailure {
   AllocationFailure(const AllocationFailure&) = delete;
   AllocationFailure& operator=(const AllocationFailure&) = delete;
   ~AllocationFailure();
+};
+
+/// While one lives, `new` finds no memory for so many bytes or more in the thread that made it.
+class LargeAllocationFailure {
+ public:
+  explicit LargeAllocationFailure(std::size_t bytes);
+  LargeAllocationFailure(const LargeAllocationFailure&) = delete;
+  LargeAllocationFailure& operator=(const LargeAllocationFailure&) = delete;
+  ~LargeAllocationFailure();
 };
 
 /// While one lives, `new` takes so many milliseconds in the thread that made it.

@@ -129,8 +129,24 @@ TEST(LoadPng, FileMayBeCutOffAnywhere) {
   const std::string whole = ReadBytes(folder / "a.png");
   for (std::size_t length = 0; length < whole.size(); ++length) {
     WriteBytes(folder / "b.png", whole.substr(0, length));
-    EXPECT_NE(Problem(folder / "b.png"), "none") << length;
+    EXPECT_EQ(Problem(folder / "b.png"), "it ends too early") << length;
   }
+}
+
+TEST(LoadPng, DamageIsToldAndTheNextFileIsRead) {
+  const TestFolder folder;
+  WritePng(folder / "a.png", 5, 4, PNG_FORMAT_GRAY, Bytes(20, 77));
+  const std::string whole = ReadBytes(folder / "a.png");
+  for (std::size_t place = 8; place < whole.size(); ++place) {
+    std::string damaged = whole;
+    damaged[place] = static_cast<char>(damaged[place] ^ 0x24);
+    WriteBytes(folder / "b.png", damaged);
+    Problem(folder / "b.png");  // most are told, and none does harm
+    if (place == 20) {          // in the header, whose check sum then differs
+      EXPECT_EQ(Problem(folder / "b.png"), "IHDR: CRC error");
+    }
+  }
+  EXPECT_EQ(Problem(folder / "a.png"), "none");
 }
 
 TEST(LoadPng, SmallFileThatClaimsAHugePictureIsRefusedAtOnce) {

@@ -14,6 +14,7 @@ void HandleScenes();     // handle/
 void LineScenes();       // line/
 void MirrorScenes();     // mirror/
 void MonoScenes();       // mono/
+void ObjectScenes();     // object/
 void OctantScenes();     // octant/
 void OverlapScenes();    // overlap/
 void PenScenes();        // pen/

@@ -34,5 +34,6 @@ int main(int argc, char** argv) {
     TextScenes();
     StateScenes();
     HandleScenes();
+    ObjectScenes();
   });
 }

@@ -6,27 +6,23 @@
 #include <climits>
 #include <cstdlib>
 #include <cstring>
-#include <memory>
 #include <new>
 
 #include <vorl/Common/LogContext.h>
+#include <vorl/Data/detail/BitmapFile.h>
 #include <vorl/Platform/detail/File.h>
+#include <vorl/Platform/detail/MemoryContext.h>
 #include <vorl/Platform/detail/SystemError.h>
 
 inline namespace vorl {
 
 namespace {
 
-constexpr WORD kBitmapFileType = 19778;  // the characters "BM"
-constexpr DWORD kOldHeaderSize = 12;     // of a header whose width and height have 16 bits
-
-struct CloseFile {
-  void operator()(std::FILE* file) const { std::fclose(file); }
-};
+constexpr DWORD kOldHeaderSize = 12;  // of a header whose width and height have 16 bits
 
 /// The size that an information header states; false when it states none.
 bool ReadSize(std::FILE* file, int& width, int& height) {
-  // One palette entry more than the header: whole files of less are no pictures.
+  // A palette entry more than the header is read; a file that ends before it has its size, too.
   unsigned char bytes[sizeof(tagBITMAPINFO)] = {};
   const std::size_t count = std::fread(bytes, 1, sizeof(bytes), file);
   tagBITMAPINFOHEADER header{};
@@ -45,29 +41,6 @@ bool ReadSize(std::FILE* file, int& width, int& height) {
   height = std::abs(header.biHeight);
   return true;
 }
-
-/// A memory device context with a bitmap selected, for the length of a scope.
-class BitmapContext {
- public:
-  explicit BitmapContext(HBITMAP bitmap)
-      : m_dc(CreateCompatibleDC(nullptr)), m_previous(SelectObject(m_dc, bitmap)) {}
-  BitmapContext(const BitmapContext&) = delete;
-  BitmapContext& operator=(const BitmapContext&) = delete;
-  ~BitmapContext() {
-    if (HasBitmap()) {
-      SelectObject(m_dc, m_previous);
-    }
-    DeleteDC(m_dc);
-  }
-
-  HDC Get() const { return m_dc; }
-  /// False when the bitmap could not be selected, because another context has it, for example.
-  bool HasBitmap() const { return m_previous != nullptr; }
-
- private:
-  HDC m_dc;
-  HGDIOBJ m_previous;
-};
 
 }  // namespace
 
@@ -136,14 +109,14 @@ bool dDIB::IsBitmapFile(const char* filePath, int& width, int& height) {
     context.Error(__LINE__, "missing filename(NULL)");
     return false;
   }
-  const std::unique_ptr<std::FILE, CloseFile> file(vorl_detail::OpenFileForReading(filePath));
+  const vorl_detail::FileHandle file(vorl_detail::OpenFileForReading(filePath));
   if (file == nullptr) {
     context.Error(__LINE__, "can't open '%s'", filePath);
     return false;
   }
   tagBITMAPFILEHEADER header{};
-  if (std::fread(&header, sizeof(header), 1, file.get()) == 1 && header.bfType == kBitmapFileType &&
-      ReadSize(file.get(), width, height)) {
+  if (std::fread(&header, sizeof(header), 1, file.get()) == 1 &&
+      header.bfType == vorl_detail::kBitmapFileType && ReadSize(file.get(), width, height)) {
     return true;
   }
   context.Info("'%s' is not a bitmap file", filePath);
@@ -151,8 +124,8 @@ bool dDIB::IsBitmapFile(const char* filePath, int& width, int& height) {
 }
 
 bool dDIB::DrawBits(const dDIB& source, int x, int y, DWORD rasterOperation) const {
-  const BitmapContext target(m_handle);
-  const BitmapContext drawn(source.m_handle);
+  const vorl_detail::MemoryContext target(nullptr, m_handle);
+  const vorl_detail::MemoryContext drawn(nullptr, source.m_handle);
   if (!target.HasBitmap()) {
     return false;
   }

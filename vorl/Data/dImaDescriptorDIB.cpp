@@ -18,7 +18,6 @@ static_assert(std::endian::native == std::endian::little, "bitmap headers are wr
 
 constexpr std::uint32_t kInfoHeaderSize = sizeof(tagBITMAPINFOHEADER);
 constexpr std::uint32_t kFileHeaderSize = sizeof(tagBITMAPFILEHEADER);
-constexpr WORD kBitmapFileType = 19778;  // the characters "BM"
 
 constexpr char kConversionPrefix[] = "unable to convert into 'Bitmap':\n\t";
 
@@ -269,7 +268,7 @@ bool dImaDescriptorDIB::WriteFileHeader(vorl_detail::BitmapFile& file) const {
     return false;  // the header cannot state it
   }
   tagBITMAPFILEHEADER fileHeader{};
-  fileHeader.bfType = kBitmapFileType;
+  fileHeader.bfType = vorl_detail::kBitmapFileType;
   fileHeader.bfSize = static_cast<DWORD>(fileBytes);
   fileHeader.bfOffBits = m_headerSize + kFileHeaderSize;
   return file.Write(&fileHeader, sizeof(fileHeader));

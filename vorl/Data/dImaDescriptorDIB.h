@@ -41,17 +41,24 @@ class VORL_API dImaDescriptorDIB : public DataBase {
   explicit dImaDescriptorDIB(dImage& image);
   /// A copy describes the same image with an information block of its own.
   dImaDescriptorDIB(const dImaDescriptorDIB& source);
+
+  /// Describes what `source` describes, with an information block of its own.
   dImaDescriptorDIB& operator=(const dImaDescriptorDIB& source);
 
+  /// The record of the object's class: `CI()`, unless a derived class overrides it.
   ClassInfo* GetClassInfo() override;
+  /// The image stays.
   ~dImaDescriptorDIB() override;
-  /// Describes nothing.
+  /// Describes nothing from now on; the status stays.
   void Reset() override;
   /// True while an image is described.
   bool IsValid() override;
+  /// The same.
   bool IsValid() const;
 
+  /// A new object, which the caller deletes; null without memory.
   static dImaDescriptorDIB* Create();
+  /// The record of this class.
   static ClassInfo& CI();
 
   /// Describes the image: returns the information block, or null on failure.
@@ -64,11 +71,11 @@ class VORL_API dImaDescriptorDIB : public DataBase {
   /// True while the block describes the image as it is now: false without an image, and when the
   /// image has been formatted anew since.
   bool IsCurrent() const;
-  /// The first pixel byte of the image; null without an image.
+  /// The first pixel byte of the image, whose it is; null without an image.
   void* GetPixelData() const;
   /// The number of colour-table entries: 2, 256 or 0.
   unsigned short GetPaletteSize() const;
-  /// The colour table; null without one.
+  /// The colour table behind the information header, to be read and changed; null without one.
   tagRGBQUAD* GetPalette() const;
   /// Makes the colour table a grey ramp from black to white, or from white to black. False without
   /// a colour table.

@@ -38,14 +38,19 @@ class VORL_API vIma2Device : public BaseClass {
  public:
   /// Draws nothing.
   vIma2Device();
-  /// A copy draws the same image in the same way.
+  /// A copy draws the same image in the same way. It makes bitmaps of its own for transparency.
   vIma2Device(const vIma2Device& source);
+  /// Draws from now on what `source` draws; the status is copied, too.
   vIma2Device& operator=(const vIma2Device& source);
 
+  /// The record of the object's class: `CI()`, unless a derived class overrides it.
   ClassInfo* GetClassInfo() override;
+  /// Deletes the bitmaps of the transparency; the image stays.
   ~vIma2Device() override;
 
+  /// A new object, which the caller deletes; null without memory.
   static vIma2Device* Create();
+  /// The record of this class.
   static ClassInfo& CI();
 
   /// Takes an image. Null rectangles: the whole image, and a target like the source.
@@ -54,36 +59,54 @@ class VORL_API vIma2Device : public BaseClass {
   /// in the status and nothing to draw, for an image of another layout. The transparency stays.
   bool Init(dImage* image, const tagRECT* sourceRect, const tagRECT* targetRect,
             bool holdAspectRatio, bool flip);
-  /// True when there is an image that can be drawn.
+  /// True when there is an image that can be drawn; an image that was formatted anew is described
+  /// anew, which makes its colour table an ascending ramp again. Sets the status: success, "not
+  /// initialized", or the descriptor's reason, which the descriptor alone logs.
   bool IsInitialized();
-  /// Sets the part of the image; null for the whole. False without an image.
+  /// Sets the part of the image that is drawn, in pixels; null for the whole. It may reach beyond
+  /// the image: what is missing is left out. The target stays as it is. False without an image
+  /// ("not initialized"): nothing changes.
   bool SetSourceRect(const tagRECT* rect);
-  /// Sets where to draw, and fits the rectangle where the aspect ratio is held; null for the source
-  /// rectangle as it is. False without an image.
+  /// Sets where to draw, in device coordinates, and fits the rectangle where the aspect ratio is
+  /// held; null for the source rectangle as it is. False without an image ("not initialized"):
+  /// nothing changes.
   bool SetTargetRect(const tagRECT* rect);
   /// Takes effect with the next `SetTargetRect`.
   void HoldAspectRatio(bool hold);
+  /// (0, 0, width, height) of the image when it was described last; all zeros without one. Like the
+  /// two below it is the object's own: it lives as long, and shows every later change.
   const tagRECT* GetImageRect() const;
+  /// The part of the image that is drawn, in pixels; all zeros without an image.
   const tagRECT* GetSourceRect() const;
+  /// Where it is drawn, in device coordinates, after fitting; all zeros without an image.
   const tagRECT* GetTargetRect() const;
 
-  /// The colour table by which 1-bit and 8-bit images are drawn: see `dImaDescriptorDIB`.
+  /// The entries of the colour table by which 1-bit and 8-bit images are drawn: 2 or 256; 0 for
+  /// other images and without one.
   unsigned short GetPaletteSize() const;
+  /// That colour table, to be read and changed; null without one. Valid until the image is
+  /// described anew: by `Init`, or when it was formatted anew and is drawn.
   tagRGBQUAD* GetPalette() const;
+  /// Makes the colour table a grey ramp from black to white, or from white to black. False without
+  /// one. What transparency has made of the image stays as it is until it is set anew.
   bool ResetPalette(bool ascending);
 
-  /// Leaves out the pixels of a colour (0x00bbggrr).
+  /// Leaves out the pixels of a colour (0x00bbggrr), as the device shows it.
   void EnableTransparency(unsigned long colour);
-  /// Leaves out the pixels that have the colour of the one at (x, y) of the picture; outside it,
-  /// black.
+  /// Leaves out the pixels that have the colour of the one at (x, y) of the picture, the top row
+  /// being 0 (of a flipped image the bottom row); outside it, black.
   void EnableTransparency(int x, int y);
+  /// Draws all pixels again.
   void DisableTransparency();
 
-  /// Draws the image; false without one ("not initialized"), and without a message when the device
-  /// refuses.
+  /// Draws the source rectangle into the target rectangle, within the clip region. Pixels that have
+  /// no place are left out (the stretch mode becomes COLORONCOLOR); with transparency the device's
+  /// stretch mode decides, and its colours are restored. False without an image ("not
+  /// initialized"), and without a message when the device refuses.
   bool Draw(HDC dc);
-  /// Fills a region with a colour, except for a rectangle (null or empty: none). False without a
-  /// region, and when the device refuses.
+  /// Fills a region with a colour (0x00bbggrr), except for a rectangle (null or empty: none), both
+  /// in device coordinates. Needs no image. False without a region ("EraseBackground: no region
+  /// specified", logged), and without a message when the device refuses.
   bool EraseBackground(HDC dc, const tagRECT* region, const tagRECT* excluded,
                        unsigned long colour);
   /// The same around the target rectangle, if `excludeImage` is set and there is an image.

@@ -9,10 +9,12 @@
 #include <vorl/GUI/vIma2Device.h>
 
 #include <vorl/GUI/detail/DeviceRect.h>
+#include <vorl/Platform/detail/MemoryContext.h>
 
 inline namespace vorl {
 
 using vorl_detail::HeightOf;
+using vorl_detail::MemoryContext;
 using vorl_detail::ToDevice;
 using vorl_detail::WidthOf;
 
@@ -20,26 +22,6 @@ namespace {
 
 constexpr COLORREF kBlack = 0;
 constexpr COLORREF kWhite = 0xFFFFFF;
-
-/// A memory device context, for the length of a scope.
-class MemoryContext {
- public:
-  MemoryContext(HDC model, HGDIOBJ bitmap)
-      : m_dc(CreateCompatibleDC(model)), m_first(SelectObject(m_dc, bitmap)) {}
-  MemoryContext(const MemoryContext&) = delete;
-  MemoryContext& operator=(const MemoryContext&) = delete;
-  ~MemoryContext() {
-    SelectObject(m_dc, m_first);
-    DeleteDC(m_dc);
-  }
-
-  HDC Get() const { return m_dc; }
-  void Select(HGDIOBJ bitmap) { SelectObject(m_dc, bitmap); }
-
- private:
-  HDC m_dc;
-  HGDIOBJ m_first;
-};
 
 /// Black text on a white background, for the length of a scope: the colours of a mask's pixels.
 class MaskColours {

@@ -65,8 +65,9 @@ VORL_API HPEN CreatePen(int style, int width, COLORREF colour);
 /// one is that of the characters; 0 takes a default of 16 for the line. Fonts above 4096 pixels are
 /// drawn in that size. `width` is the average character's, 0 for the font's own. A null or unknown
 /// `face` takes the font that comes nearest, in the family that `pitchAndFamily` names. Text always
-/// runs from left to right: `escapement` and `orientation` are kept but have no effect. Null when
-/// memory is exhausted.
+/// runs from left to right: `escapement` and `orientation` are kept but have no effect. With
+/// NONANTIALIASED_QUALITY, and on bitmaps of fewer than 16 bits, pixels are either set or not. Null
+/// when memory is exhausted.
 VORL_API HFONT CreateFontA(int height, int width, int escapement, int orientation, int weight,
                            DWORD italic, DWORD underline, DWORD strikeOut, DWORD charSet,
                            DWORD outPrecision, DWORD clipPrecision, DWORD quality,
@@ -94,9 +95,18 @@ VORL_API HBITMAP CreateBitmap(int width, int height, UINT planes, UINT bitCount,
 /// `flags` it receives the picture of `bits` and `info`. Null on failure.
 VORL_API HBITMAP CreateDIBitmap(HDC dc, const BITMAPINFOHEADER* header, DWORD flags,
                                 const void* bits, const BITMAPINFO* info, UINT usage);
-/// Copies `count` rows of a bitmap, from row `start` (counted from the bottom) on, into `bits` in
-/// the format of `info`, and fills in its colour table. Null `bits`: completes the header; with
-/// `biBitCount` 0 it receives the bitmap's own format. Returns the rows copied; 0 on failure.
+/// Copies `count` rows of a bitmap, from row `start` (counted from the bottom of the picture that
+/// `info` describes) on, into `bits`, and fills in the colour table and the size behind the header.
+/// The pictures share their upper left corner; what the bitmap lacks is 0. The bitmap that every
+/// new context has shows what was drawn in `dc`. `usage` has to be DIB_RGB_COLORS, the format
+/// without masks.
+///
+/// Returns
+/// - the rows that the bitmap had a part of: fewer than were filled where the picture is higher;
+/// - 1 where no row was asked for: null `bits`, a `count` of 0, a `start` beyond the picture;
+/// - the bitmap's height where `biBitCount` is 0: then the header receives the bitmap's own format,
+///   and nothing is copied;
+/// - 0 on failure.
 VORL_API int GetDIBits(HDC dc, HBITMAP bitmap, UINT start, UINT count, LPVOID bits,
                        LPBITMAPINFO info, UINT usage);
 
@@ -119,6 +129,7 @@ VORL_API int StretchDIBits(HDC dc, int x, int y, int width, int height, int sour
                            int sourceWidth, int sourceHeight, const void* bits,
                            const BITMAPINFO* info, UINT usage, DWORD rop);
 /// Sets the stretch mode (BLACKONWHITE ... HALFTONE); returns the one before, 0 on failure.
+/// HALFTONE is the one mode whose pixels are not the system's: it is drawn like COLORONCOLOR.
 VORL_API int SetStretchBltMode(HDC dc, int mode);
 
 // ---- Shapes ----

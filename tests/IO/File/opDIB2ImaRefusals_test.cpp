@@ -28,6 +28,13 @@ using bitmap_test::Ramp;
 constexpr std::int32_t kLowest = std::numeric_limits<std::int32_t>::min();
 constexpr std::int32_t kHighest = std::numeric_limits<std::int32_t>::max();
 
+/// Which context logs a refusal.
+std::string Title(const std::string& text) {
+  const bool isOfOutput = text.rfind("opDIB2Ima: unsupported pixel depth", 0) == 0 ||
+                          text.rfind("can't initialize the output image", 0) == 0;
+  return isOfOutput ? "opDIB2Ima::InitOutputImage: " : "opDIB2Ima::Convert: ";
+}
+
 class opDIB2ImaRefusal : public BinaryFileTest {
  protected:
   /// The status after a conversion that must fail; '@' stands for the file's name.
@@ -41,8 +48,7 @@ class opDIB2ImaRefusal : public BinaryFileTest {
     EXPECT_EQ(image.GetWidth(), 0U);
     EXPECT_TRUE(op.GetStatus() == -1);
     std::string text = static_cast<const char*>(op.GetStatus());
-    EXPECT_EQ(log.errors.size(), 1U);
-    EXPECT_NE(log.errors.at(0).find(": " + text), std::string::npos) << log.errors.at(0);
+    EXPECT_EQ(log.errors, std::vector<std::string>{Title(text) + text});
     if (path != nullptr && *path != '\0' && text.find(path) != std::string::npos) {
       text.replace(text.find(path), std::strlen(path), "@");
     }
@@ -277,7 +283,7 @@ class opDIB2ImaMemory : public testing::Test {
     EXPECT_FALSE(op.Convert(info, bits, image));
     EXPECT_FALSE(image.IsValid());
     const std::string text = static_cast<const char*>(op.GetStatus());
-    EXPECT_NE(log.errors.back().find(": " + text), std::string::npos) << log.errors.back();
+    EXPECT_EQ(log.errors.back(), Title(text) + text);
     return text;
   }
 
@@ -300,6 +306,16 @@ TEST_F(opDIB2ImaMemory, HeaderIsCheckedLikeThatOfAFile) {
   m_info.bmiHeader.biHeight = 4;
   m_info.bmiHeader.biBitCount = 5;
   EXPECT_EQ(Refusal(&m_info, m_bits), "opDIB2Ima: unsupported pixel depth: 5");
+}
+
+TEST_F(opDIB2ImaMemory, ImageWhoseOwnBitsAreRefusedIsResetToo) {
+  dImage image;
+  ASSERT_TRUE(image.Init(4, 4, ImageDataType_U8, "BGR", 0, 4));
+  m_info.bmiHeader.biBitCount = 5;
+  opDIB2Ima op;
+  EXPECT_FALSE(op.Convert(&m_info, image.GetDataPtr(), image));
+  EXPECT_STREQ(op.GetStatus(), "opDIB2Ima: unsupported pixel depth: 5");
+  EXPECT_FALSE(image.IsValid());
 }
 
 TEST_F(opDIB2ImaMemory, ImageThatCannotBeHadTellsWhy) {

@@ -348,10 +348,10 @@ class OpenOperator : public opDIB2Ima {
   using opDIB2Ima::InitOutputImage;
 };
 
-TEST(opDIB2Ima, OutputImageHasTheHeightWithoutItsSign) {
+TEST(opDIB2Ima, OutputImageHasItsSizeWithoutSigns) {
   OpenOperator op;
   dImage image;
-  ASSERT_TRUE(op.InitOutputImage(image, 5, -7, 24));
+  ASSERT_TRUE(op.InitOutputImage(image, -5, -7, 24));
   EXPECT_EQ(image.GetWidth(), 5U);
   EXPECT_EQ(image.GetHeight(), 7U);
   EXPECT_STREQ(image.GetChannelSequence(), "BGR");

@@ -9,6 +9,8 @@
 #include <cstring>
 #include <string>
 
+#include <png.h>
+
 #include "../../Data/DibTesting.h"
 #include "../TestFolder.h"
 #include "PictureFile.h"
@@ -146,6 +148,52 @@ TEST(BmpConvert, PngLeavesTheFourthByteOut) {
       EXPECT_EQ(std::memcmp(picture.GetDataPtr(x, y), bitmap.GetDataPtr(x, y), 3), 0);
     }
   }
+}
+
+TEST(BmpConvert, PngWithTransparencyBecomesThirtyTwoBits) {
+  const TestFolder folder;
+  const unsigned char pixels[] = {1, 2,   3, 9, 4,  5,
+                                  6, 255, 7, 8, 10, 0};  // red, green, blue, alpha
+  png_image png{};
+  png.version = PNG_IMAGE_VERSION;
+  png.width = 3;
+  png.height = 1;
+  png.format = PNG_FORMAT_RGBA;
+  const std::string first = (folder / "a.png").string();
+  ASSERT_NE(png_image_write_to_file(&png, first.c_str(), 0, pixels, 0, nullptr), 0);
+  const std::string second = (folder / "b.bmp").string();
+  const Outcome outcome = RunTool({"bmp", "convert", first, second});
+  ASSERT_EQ(outcome.code, 0) << outcome.errors;
+  const std::string bytes = ReadBytes(second);
+  ASSERT_EQ(bytes.size(), 54U + 12U);
+  EXPECT_EQ(bytes[28], 32);  // bits per pixel
+  EXPECT_EQ(bytes.substr(54), std::string("\3\2\1\x9\6\5\4\xFF\xA\x8\7\0", 12));
+}
+
+TEST(BmpConvert, PaletteIsOfGreyPicturesOnly) {
+  const TestFolder folder;
+  for (const short channels : {short{3}, short{4}}) {
+    const std::string first = WriteBitmap(folder, "a.bmp", channels, 8);
+    for (const char* const order : {"ascending", "descending"}) {
+      const std::string second = (folder / "b.bmp").string();
+      const Outcome outcome = RunTool({"bmp", "convert", "--palette", order, first, second});
+      EXPECT_EQ(outcome.code, 0) << outcome.errors;
+      EXPECT_EQ(ReadBytes(second), ReadBytes(first)) << channels << order;
+    }
+  }
+}
+
+TEST(BmpConvert, DescendingPaletteOfOneBitBeginsWithWhite) {
+  const TestFolder folder;
+  const std::string first = WriteBitmap(folder, "a.bmp", 1, 1);
+  const std::string second = (folder / "b.bmp").string();
+  ASSERT_EQ(RunTool({"bmp", "convert", "--palette", "ascending", first, second}).code, 0);
+  EXPECT_EQ(ReadBytes(second), ReadBytes(first));
+  ASSERT_EQ(RunTool({"bmp", "convert", "--palette", "descending", first, second}).code, 0);
+  std::string expected = ReadBytes(first);
+  ASSERT_EQ(expected.substr(54, 8), std::string("\0\0\0\0\xFF\xFF\xFF\0", 8));
+  expected.replace(54, 8, std::string("\xFF\xFF\xFF\0\0\0\0\0", 8));
+  EXPECT_EQ(ReadBytes(second), expected);  // the pixels stay as they are
 }
 
 TEST(BmpConvert, DescendingPaletteMakesTheNegative) {

@@ -5,16 +5,14 @@
 #include <system_error>
 #include <utility>
 
+#include <vorl/Platform/detail/File.h>
+
 inline namespace vorl {
 namespace vorl_detail {
 
 namespace fs = std::filesystem;
 
 namespace {
-
-std::FILE* OpenForWriting(const char* path) {
-  return std::fopen(path, "wb");
-}
 
 bool IsDevice(const char* path) {
   std::error_code error;
@@ -47,7 +45,7 @@ bool MakeRoomForFile(const char* path) {
 BitmapFile::BitmapFile(const char* path) : m_file(nullptr) {
   try {
     m_path = path;
-    m_file = OpenForWriting(path);
+    m_file = OpenFileForWriting(path);
     if (m_file != nullptr) {
       m_buffer.Attach(m_file);
     }

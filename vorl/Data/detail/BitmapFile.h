@@ -13,6 +13,9 @@
 inline namespace vorl {
 namespace vorl_detail {
 
+/// What a bitmap file begins with: the characters "BM".
+inline constexpr std::uint16_t kBitmapFileType = 19778;
+
 /// Bytes of a bitmap row, which is a multiple of 32 bits long.
 inline std::uint64_t BitmapRowBytes(std::uint64_t width, unsigned bitsPerPixel) {
   return (width * bitsPerPixel + 31) / 32 * 4;

@@ -101,6 +101,15 @@ bool SharesBytes(const dImage& image, const void* bytes, std::uint64_t size) {
          (pixels < first ? first - pixels < image.GetImageSize() : pixels - first < size);
 }
 
+/// True when the image has the pixels that were asked for: the `Init` of a derived class may have
+/// given it others, of several planes for example, whose columns lie closer together. Rows may have
+/// any alignment.
+bool HasPixels(const dImage& image, unsigned long columns, unsigned long rows, int bitsPerPixel) {
+  return image.IsValid() && image.GetWidth() == columns && image.GetHeight() == rows &&
+         image.GetColumnOffset() == static_cast<unsigned long>(bitsPerPixel) &&
+         std::uint64_t{image.GetBytesPerRow()} * rows <= image.GetImageSize();
+}
+
 /// Brings the rows of a bitmap into an image that has been formatted for them.
 class RowConverter {
  public:
@@ -108,8 +117,9 @@ class RowConverter {
       : m_source(source),
         m_image(image),
         m_targetBits(targetBits),
-        m_isCopied(targetBits == source.header.biBitCount &&
-                   (targetBits != 8 || IsPlainRamp(source))) {}
+        m_isSame(targetBits == source.header.biBitCount &&
+                 (targetBits != 8 || IsPlainRamp(source))),
+        m_isCopied(m_isSame && source.RowBytes() <= image.GetBytesPerRow()) {}
 
   /// False, with the reason, when there is no memory or a row cannot be read.
   bool Run(dStatus& status) {
@@ -124,7 +134,7 @@ class RowConverter {
       auto* row = static_cast<unsigned char*>(
           m_image.GetRowPtr(m_source.IsBottomUp() ? height - 1 - i : i));
       if (!(m_isCopied ? m_source.ReadRow(row, static_cast<std::size_t>(rowBytes))
-                       : ReadExpanded(row))) {
+                       : ReadPacked(row))) {
         m_source.SetCutOff(status);
         return false;
       }
@@ -133,13 +143,17 @@ class RowConverter {
   }
 
  private:
-  bool ReadExpanded(unsigned char* row) {
+  bool ReadPacked(unsigned char* row) {
     auto* packed = static_cast<unsigned char*>(m_packed.Get(0));
     const auto width = static_cast<std::size_t>(m_source.Width());
-    const std::size_t used = width * static_cast<std::size_t>(m_targetBits) / 8;
+    const std::size_t used = (width * static_cast<std::size_t>(m_targetBits) + 7) / 8;
     std::memset(row + used, 0, m_image.GetBytesPerRow() - used);
     if (!m_source.ReadRow(packed, m_packed.GetSize())) {
       return false;
+    }
+    if (m_isSame) {
+      std::memcpy(row, packed, used);
+      return true;
     }
     if (m_source.header.biBitCount == 16) {
       return vorl_detail::ExpandRGB16(width, row, packed);
@@ -152,7 +166,8 @@ class RowConverter {
   dImage& m_image;
   dBuffer m_packed;  ///< a row as it is stored
   int m_targetBits;
-  bool m_isCopied;
+  bool m_isSame;    ///< the pixels are stored as the image has them
+  bool m_isCopied;  ///< whole rows, padding included
 };
 
 }  // namespace
@@ -265,6 +280,11 @@ bool opDIB2Ima::InitOutputImage(dImage& image, int width, int height, int bitsPe
   const auto rows = static_cast<unsigned long>(std::llabs(height));
   if (!image.Init(columns, rows, dataType, sequence, ImageDataOrder_Pixel, 4)) {
     m_status.Set(image.GetStatus(), "can't initialize the output image: ");
+    context.Status(__LINE__, m_status);
+    return false;
+  }
+  if (!HasPixels(image, columns, rows, bitsPerPixel)) {
+    m_status.Set(false, "can't initialize the output image: it has another format");
     context.Status(__LINE__, m_status);
     return false;
   }

@@ -32,8 +32,8 @@ class BitmapSource;
 /// file never more than stand before the pixels. An index without an entry is black.
 ///
 /// Bitmaps have a header of 40 bytes, or one of 52, 56, 108 or 124 that goes on behind the same
-/// fields, and are not compressed. 16-bit bitmaps with bit masks are read
-/// like those without; of 32-bit ones the masks must be those of plain pixels.
+/// fields, and are not compressed. 16-bit bitmaps with bit masks are read like those without; of
+/// 32-bit ones the masks must be those of plain pixels.
 ///
 /// *Errors.* `Convert` returns false, sets and logs the status, and leaves the image reset:
 /// - "no name for bitmap file specified", "no bitmap information block specified", "no pixel bits
@@ -44,21 +44,26 @@ class BitmapSource;
 /// - "opDIB2Ima: unsupported header size: %lu", "opDIB2Ima: invalid number of planes: %d",
 ///   "opDIB2Ima: unsupported compression: %s", "opDIB2Ima: invalid bitmap size: %ld x %ld",
 ///   "opDIB2Ima: unsupported pixel depth: %d";
-/// - "can't initialize the output image: " and the image's message.
+/// - "can't initialize the output image: " and the image's message, or "it has another format": the
+///   `Init` of a derived class succeeded, but gave it other pixels than it was asked for.
 ///
 /// What a file claims is compared with its size before anything is allocated.
 ///
 /// As an operator this class does nothing: `Run` succeeds.
 class VORL_API opDIB2Ima : public OpBase {
  public:
+  /// Converts nothing yet.
   opDIB2Ima();
   /// `Convert(filePath, image)` at once.
   opDIB2Ima(const char* filePath, dImage& image);
   /// `Convert(info, bits, image)` at once.
   opDIB2Ima(const tagBITMAPINFO* info, const void* bits, dImage& image);
+  /// Has the status of `source`.
   opDIB2Ima(const opDIB2Ima& source);
+  /// Takes the status of `source`.
   opDIB2Ima& operator=(const opDIB2Ima& source);
 
+  /// The record of the object's class: `CI()`, unless a derived class overrides it.
   ClassInfo* GetClassInfo() override;
   ~opDIB2Ima() override;
   /// Returns true.
@@ -71,7 +76,9 @@ class VORL_API opDIB2Ima : public OpBase {
   bool Process() override;
 
  public:
+  /// A new object, which the caller deletes; null without memory.
   static opDIB2Ima* Create();
+  /// The record of this class.
   static ClassInfo& CI();
 
   /// Reads a bitmap file into the image, whose virtual `Init` gives it its format.
@@ -81,7 +88,9 @@ class VORL_API opDIB2Ima : public OpBase {
   bool Convert(const tagBITMAPINFO* info, const void* bits, dImage& image);
 
  protected:
-  /// Formats the image for 1, 8, 24 or 32 bits per pixel; the height may be negative.
+  /// Formats the image for 1, 8, 24 or 32 bits per pixel, through its virtual `Init`, without the
+  /// signs of width and height. False, with the status set and logged: "opDIB2Ima: unsupported
+  /// pixel depth: %d", and the two kinds of "can't initialize the output image: ".
   bool InitOutputImage(dImage& image, int width, int height, int bitsPerPixel);
 
  private:

@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <cstdio>
+#include <memory>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -14,6 +15,12 @@ std::FILE* OpenFileForReading(const char* name);
 /// Creates or truncates a file for binary writing. Null when that is impossible, and for anything
 /// but regular files and character devices (never waits for the reader of a pipe).
 std::FILE* OpenFileForWriting(const char* name);
+
+struct CloseFile {
+  void operator()(std::FILE* file) const { std::fclose(file); }
+};
+/// An open file that is closed with its owner. For reading: what closing tells is not looked at.
+using FileHandle = std::unique_ptr<std::FILE, CloseFile>;
 
 /// The size of an open regular file in bytes; 0 when the system does not tell.
 std::uint64_t FileSize(std::FILE* file);

@@ -36,6 +36,17 @@ int DescribeFormat(const Surface& surface, LPBITMAPINFO info) {
   return surface.height;
 }
 
+// The stock bitmap has no pixel of its own: each context that has it selected has one for it.
+Surface SurfaceOf(const Bitmap& bitmap, const DeviceContext& context) {
+  if (!bitmap.stock) {
+    return bitmap.surface;
+  }
+  static std::uint8_t black[4]{};
+  Surface surface = bitmap.surface;
+  surface.top = context.state.bitmap->stock && !context.screen ? context.Target().top : black;
+  return surface;
+}
+
 PixelFormat FormatFor(const PixelFormat& bitmap, const DibLayout& layout) {
   if (layout.format.depth <= 8 && bitmap.depth == layout.format.depth) {
     PixelFormat format = bitmap;
@@ -115,19 +126,20 @@ int GetDIBits(HDC dc, HBITMAP handle, UINT start, UINT count, LPVOID bits, LPBIT
   return Guarded(0, [&] {
     const auto context = Find<DeviceContext>(dc);
     const auto bitmap = Find<Bitmap>(handle);
-    if (!context || !bitmap || info == nullptr || usage != DIB_RGB_COLORS || bitmap->stock) {
+    if (!context || !bitmap || info == nullptr || usage != DIB_RGB_COLORS) {
       SetError(context && bitmap ? ERROR_INVALID_PARAMETER : ERROR_INVALID_HANDLE);
       return 0;
     }
+    const Surface surface = SurfaceOf(*bitmap, *context);
     BITMAPINFOHEADER& header = info->bmiHeader;
     if (header.biSize >= sizeof header && header.biBitCount == 0) {
-      return DescribeFormat(bitmap->surface, info);
+      return DescribeFormat(surface, info);
     }
     auto layout = ReadHeader(header);
     if (!layout || header.biCompression != BI_RGB) {
       return 0;
     }
-    layout->format = FormatFor(bitmap->surface.format, *layout);
+    layout->format = FormatFor(surface.format, *layout);
     header.biClrUsed = 0;
     header.biSizeImage = static_cast<DWORD>(layout->Bytes());
     WriteColours(layout->format, info, header.biSize);
@@ -136,6 +148,6 @@ int GetDIBits(HDC dc, HBITMAP handle, UINT start, UINT count, LPVOID bits, LPBIT
     if (bits == nullptr || rows == 0) {
       return 1;
     }
-    return CopyRows(bitmap->surface, *layout, start, rows, static_cast<std::uint8_t*>(bits));
+    return CopyRows(surface, *layout, start, rows, static_cast<std::uint8_t*>(bits));
   });
 }

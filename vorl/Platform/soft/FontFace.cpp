@@ -289,13 +289,31 @@ FontFace::~FontFace() {
   }
 }
 
-const Glyph& FontFace::GlyphOf(char32_t character) {
+// When the kept glyphs have grown too large, all are dropped: the text that is drawn next brings
+// back those that are in use.
+std::shared_ptr<const Glyph> FontFace::GlyphOf(char32_t character) {
   const std::lock_guard lock(FontMutex());
   const auto found = m_glyphs.find(character);
   if (found != m_glyphs.end()) {
     return found->second;
   }
-  return m_glyphs.emplace(character, Render(character)).first->second;
+  const auto glyph = std::make_shared<const Glyph>(Render(character));
+  const std::size_t bytes = sizeof(Glyph) + glyph->coverage.capacity();
+  if (bytes > kMostBytes) {
+    return glyph;
+  }
+  if (bytes > kMostBytes - m_keptBytes) {
+    m_glyphs.clear();
+    m_keptBytes = 0;
+  }
+  m_glyphs.emplace(character, glyph);
+  m_keptBytes += bytes;
+  return glyph;
+}
+
+std::size_t FontFace::KeptBytes() const {
+  const std::lock_guard lock(FontMutex());
+  return m_keptBytes;
 }
 
 Glyph FontFace::Render(char32_t character) const {

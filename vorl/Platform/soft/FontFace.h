@@ -49,8 +49,11 @@ class FontFace {
   FontFace& operator=(const FontFace&) = delete;
 
   const FontMetrics& Metrics() const { return m_metrics; }
-  /// Stays valid as long as the font. Characters that the font lacks have its "missing" picture.
-  const Glyph& GlyphOf(char32_t character);
+  /// Characters that the font lacks have its "missing" picture. Never null.
+  std::shared_ptr<const Glyph> GlyphOf(char32_t character);
+  /// What the glyphs take that are kept for their next use: no more than `kMostBytes`.
+  std::size_t KeptBytes() const;
+  static constexpr std::size_t kMostBytes = std::size_t{4} << 20;
 
  private:
   FontFace() = default;
@@ -63,7 +66,8 @@ class FontFace {
   FontMetrics m_metrics;
   bool m_isEmboldened = false;
   bool m_isSlanted = false;
-  std::unordered_map<char32_t, Glyph> m_glyphs;
+  std::unordered_map<char32_t, std::shared_ptr<const Glyph>> m_glyphs;
+  std::size_t m_keptBytes = 0;
 };
 
 }  // namespace vorl_detail

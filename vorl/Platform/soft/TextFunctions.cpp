@@ -167,9 +167,9 @@ HFONT CreateFontA(int height, int width, int escapement, int orientation, int we
     description.lfEscapement = escapement;
     description.lfOrientation = orientation;
     description.lfWeight = weight;
-    description.lfItalic = italic != 0 ? 1 : 0;
-    description.lfUnderline = underline != 0 ? 1 : 0;
-    description.lfStrikeOut = strikeOut != 0 ? 1 : 0;
+    description.lfItalic = static_cast<BYTE>(italic);
+    description.lfUnderline = static_cast<BYTE>(underline);
+    description.lfStrikeOut = static_cast<BYTE>(strikeOut);
     description.lfCharSet = static_cast<BYTE>(charSet);
     description.lfOutPrecision = static_cast<BYTE>(outPrecision);
     description.lfClipPrecision = static_cast<BYTE>(clipPrecision);

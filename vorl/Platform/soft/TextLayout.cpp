@@ -66,7 +66,7 @@ class Ruler {
         startsRun = false;
       }
       TextRun& run = line.runs.back();
-      const int advance = m_font.GlyphOf(character.code).advance;
+      const int advance = m_font.GlyphOf(character.code)->advance;
       run.characters.push_back({character.code, line.width, advance, &character == underlined});
       run.width += advance;
       line.width += advance;
@@ -82,7 +82,7 @@ class Ruler {
         width = NextTabStop(width);
         continue;
       }
-      width += m_font.GlyphOf(characters[i].code).advance;
+      width += m_font.GlyphOf(characters[i].code)->advance;
       if (width > limit) {
         return i;
       }

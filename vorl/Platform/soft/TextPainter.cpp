@@ -46,7 +46,7 @@ void TextPainter::Draw(const TextRun& run, std::int64_t x, std::int64_t top) con
     FillBox(left, top, left + run.width, top + metrics.Height(), m_dc.state.backgroundColour);
   }
   for (const PlacedCharacter& character : run.characters) {
-    DrawGlyph(m_font.GlyphOf(character.code), x + character.x, baseline);
+    DrawGlyph(*m_font.GlyphOf(character.code), x + character.x, baseline);
     if (character.isUnderlined) {
       FillBox(x + character.x, baseline + 1, x + character.x + character.advance - 1, baseline + 2,
               ink);

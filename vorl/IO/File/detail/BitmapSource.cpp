@@ -6,8 +6,6 @@
 #include <cstring>
 #include <limits>
 
-#include <vorl/Platform/detail/File.h>
-
 inline namespace vorl {
 namespace vorl_detail {
 
@@ -15,7 +13,6 @@ namespace {
 
 static_assert(std::endian::native == std::endian::little, "bitmap headers are read as they lie");
 
-constexpr WORD kBitmapFileType = 19778;  // the characters "BM"
 constexpr DWORD kInfoHeaderSize = sizeof(tagBITMAPINFOHEADER);
 // The header with red, green and blue masks, with alpha, with colour space, and with profile: each
 // begins with the fields of the one before.

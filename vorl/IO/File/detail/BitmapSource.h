@@ -7,11 +7,10 @@
 #include <vorl/Common/dStatus.h>
 #include <vorl/Data/detail/BitmapFile.h>
 #include <vorl/Platform/Gdi.h>
+#include <vorl/Platform/detail/File.h>
 
 #include <array>
 #include <cstdint>
-#include <cstdio>
-#include <memory>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -86,15 +85,11 @@ class BitmapInFile : public BitmapSource {
   void SetCutOff(dStatus& status) const override;
 
  private:
-  struct CloseFile {
-    void operator()(std::FILE* file) const { std::fclose(file); }
-  };
-
   bool ReadHeaders(dStatus& status);
   bool Read(void* target, std::size_t bytes);
 
   RowBuffer m_buffer;
-  std::unique_ptr<std::FILE, CloseFile> m_file;
+  FileHandle m_file;
   const char* m_path = nullptr;
 };
 
