@@ -58,10 +58,12 @@ struct CellLook {
 };
 
 /// A cell of a sheet: a viewport that shows one layer of objects, with the graphic position (0, 0)
-/// in a corner. The mouse is told in device units from the cell's top left corner.
+/// in a corner. The layer must outlive it. The mouse is told in device units from the cell's top
+/// left corner.
 class Cell {
  public:
-  Cell(const ContactSheet& sheet, int column, int row, const CellLook& look = {})
+  Cell(const ContactSheet& sheet, int column, int row, GraphicHandler& handler,
+       const CellLook& look = {})
       : m_dc(sheet), m_rect(sheet.CellAt(column, row)) {
     const float width = static_cast<float>(m_rect.right - m_rect.left) / look.scale;
     const float height = static_cast<float>(m_rect.bottom - m_rect.top) / look.scale;
@@ -69,18 +71,21 @@ class Cell {
     viewPort.Init(area, area, Rect2D(m_rect));
     viewPort.SetBgColor(static_cast<long>(look.background));
     viewPort.SetProportional(false);
+    viewPort.SetGraphic(&handler);
     viewPort.UpdateTransformation();
   }
   Cell(const Cell&) = delete;
   Cell& operator=(const Cell&) = delete;
 
-  void Show(GraphicHandler& handler) { viewPort.SetGraphic(&handler); }
   bool Down(int x, int y, int flags = 0) { return Send(MouseEvent_ButtonDown, x, y, flags); }
   bool Move(int x, int y, int flags = 0) { return Send(MouseEvent_Move, x, y, flags); }
   bool Up(int x, int y, int flags = 0) { return Send(MouseEvent_ButtonUp, x, y, flags); }
   void Draw() {
-    const int saved = SaveDC(m_dc);
+    // Each leaves a clip region of its own.
+    int saved = SaveDC(m_dc);
     viewPort.EraseBkgnd(m_dc, nullptr, false);
+    RestoreDC(m_dc, saved);
+    saved = SaveDC(m_dc);
     viewPort.Draw(m_dc, nullptr, false);
     RestoreDC(m_dc, saved);
   }
@@ -113,12 +118,11 @@ void DrawStates(const ContactSheet& sheet, int row, const View& model, const Dra
                 const CellLook& look = {}) {
   const auto [from, to, flags] = drag;
   for (int column = 0; column < kNumStates - 1; ++column) {
-    Cell cell(sheet, column, row, look);
     View view(model);
     view.SetViewState(VGViewState_Visible);
     GraphicHandler handler;
     handler.AddObject(&view);
-    cell.Show(handler);
+    Cell cell(sheet, column, row, handler, look);
     if (column > 0) {
       EXPECT_TRUE(cell.Down(from.x, from.y, flags));
     }
@@ -130,10 +134,9 @@ void DrawStates(const ContactSheet& sheet, int row, const View& model, const Dra
     }
     cell.Draw();
   }
-  Cell cell(sheet, kNumStates - 1, row, look);
   Creator<View> creator(model);
   creator.SetCreateMode(const_cast<View&>(model).GetObjType(), 1);
-  cell.Show(creator);
+  Cell cell(sheet, kNumStates - 1, row, creator, look);
   EXPECT_TRUE(cell.Down(from.x, from.y));
   EXPECT_NE(creator.GetObject(1), nullptr);
   cell.Move(to.x, to.y);

@@ -33,6 +33,24 @@ class ShapeROP {
   int m_old;
 };
 
+/// Leaves the gaps of broken lines as they are, instead of filling them with the background colour
+/// of the device context.
+class TransparentGaps {
+ public:
+  explicit TransparentGaps(HDC dc) : m_dc(dc), m_old(SetBkMode(dc, TRANSPARENT)) {}
+  TransparentGaps(const TransparentGaps&) = delete;
+  TransparentGaps& operator=(const TransparentGaps&) = delete;
+  ~TransparentGaps() {
+    if (m_old != 0) {
+      SetBkMode(m_dc, m_old);
+    }
+  }
+
+ private:
+  HDC m_dc;
+  int m_old;
+};
+
 /// A pen of a shape's style in a device context, in the shape's colour where no other is given.
 class ShapePen {
  public:
