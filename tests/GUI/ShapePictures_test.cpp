@@ -5,6 +5,7 @@
 #include <vorl/GUI/VGLine.h>
 #include <vorl/GUI/VGPoint.h>
 #include <vorl/GUI/VGRect.h>
+#include <vorl/GUI/VGText.h>
 
 #include <gtest/gtest.h>
 
@@ -18,6 +19,7 @@ using gui_testing::ContactSheet;
 using gui_testing::Drag;
 using gui_testing::DrawStates;
 using gui_testing::ExpectPicture;
+using gui_testing::HasStoredFont;
 using gui_testing::kNumStates;
 
 constexpr int kRed = 0x0000D0;
@@ -96,6 +98,33 @@ TEST(ShapePictures, Rectangles) {
   // Its corners are swapped.
   DrawStates(sheet, 5, Rect(31, 25, 6, 6, PS_SOLID, 2, kGreen), Drag{{31, 16}, {40, 16}});
   ExpectPicture(sheet, "Rectangles");
+}
+
+VGTextView Text(const char* words, short alignment, int color) {
+  VGText text;
+  text = words;
+  text.SetPos(36.0F, 18.0F, alignment);
+  VGTextView view(text);
+  view.SetPenColor(color);
+  view.Enable(kEditable);
+  return view;
+}
+
+// The letters are the system's; where they stand is compared everywhere in VGTextDraw_test.cpp.
+TEST(ShapePictures, Texts) {
+  const Drag drag{{36, 18}, {30, 24}};
+  ContactSheet sheet(kNumStates, 4, 72, 36);
+  DrawStates(sheet, 0, Text("Centre", 15, kRed), drag);
+  DrawStates(sheet, 1, Text("right", 5, kBlue), drag);
+  DrawStates(sheet, 2, Text("left", 0, kGreen), drag);
+  VGTextView opaque = Text("Label", 12, 0xFFFFFF);
+  opaque.SetTransparent(false);
+  opaque.SetBgColor(kBlue);
+  DrawStates(sheet, 3, opaque, drag, CellLook{1.0F, 0x402000});
+  if (!HasStoredFont()) {
+    GTEST_SKIP() << "the letters here are not those of the stored picture";
+  }
+  ExpectPicture(sheet, "Texts");
 }
 
 VGCrossCursorView Cursor(float x, float y, short mode, int thickness) {
