@@ -159,6 +159,26 @@ TEST(VGAxisViewDraw, LabelsShowTheUnit) {
   EXPECT_EQ(Drawn(view), LabelAt("1000", 100) + LabelAt("2000", 200));
 }
 
+TEST(VGAxisViewDraw, ColoursAreKeptByAssignment) {
+  VGAxisView source = AxisView(31);
+  source.SetPenColor(0x0000FF);
+  source.SetGrayColor(0x00FF00);
+  VGAxisView view;
+  view = source;
+  Canvas canvas(kSize, kSize);
+  canvas.Fill(0);
+  view.SetDisplayFlags(VGAxisDisplay_Ticks);
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(canvas.At(80, 24), 0x00FF00U);
+  canvas.Fill(0);
+  view.SetDisplayFlags(VGAxisDisplay_Labels);
+  view.DrawGraphic(canvas);
+  ASSERT_FALSE(Lit(canvas).empty());
+  for (const auto& [x, y] : Lit(canvas)) {
+    EXPECT_EQ(canvas.At(x, y) & 0xFFFF00U, 0U) << "labels have the colour of the pen";
+  }
+}
+
 TEST(VGAxisViewDraw, LabelsStayInsideTheClipBox) {
   VGAxisView view = AxisView(VGAxisDisplay_Labels);
   Canvas canvas(kSize, kSize);
@@ -219,6 +239,21 @@ TEST(VGAxisViewDraw, TicksAndLabelsStandAboveWhereThereIsNoRoomBelow) {
   EXPECT_TRUE(drawnAt(kSize - 2).contains({100, kSize - 1})) << "without labels they stay below";
 }
 
+TEST(VGAxisViewDraw, SlantedAxisNeedsRoomAtBothEnds) {
+  for (const float slope : {30.0F, -30.0F}) {
+    VGAxisView view = AxisView(VGAxisDisplay_Labels | VGAxisDisplay_Ticks);
+    view.SetPos(dVect2D(10, static_cast<float>(kSize - 20) - std::max(slope, 0.0F)));
+    view.SetVector(dVect2D(210, slope));
+    view.Transform(false);
+    Canvas canvas(kSize, kSize);
+    canvas.Fill(0);
+    view.DrawGraphic(canvas);
+    const int y = static_cast<int>(view.GetPos().y + slope * 90.0F / 210.0F);
+    EXPECT_NE(canvas.At(100, y - 7), 0U) << slope;
+    EXPECT_EQ(canvas.At(100, y + 7), 0U) << slope;
+  }
+}
+
 TEST(VGAxisViewDraw, VerticalLabelsStandOnTheRightWhereThereIsNoRoomOnTheLeft) {
   const tagRECT size = SizeOf("100");
   VGAxis axis;
@@ -249,6 +284,16 @@ TEST(VGAxisViewDraw, IntegerUnitHasTicksAtWholeNumbersOnly) {
     twos = twos + Line(x, 20, x, x % 40 == 0 ? 29 : 25);
   }
   EXPECT_EQ(Drawn(view), twos) << "parted by the odd numbers alone";
+  view.SetDisplayFlags(0x80);
+  view.SetPos(dVect2D(10, 100));
+  view.Transform(false);
+  view.EnableHLValue(true, 0);
+  view.SetHLValueType(VGAxisHLType_Value, 0);
+  view.SetHLColors(0xFFFFFF, 0x00FF00, 0);
+  view.SetHLValue(7.0, 0);
+  const tagRECT size = SizeOf("7");
+  EXPECT_EQ(Drawn(view).size(), static_cast<std::size_t>(size.right * size.bottom))
+      << "without decimals";
 }
 
 TEST(VGAxisViewDraw, UnitTextStandsAtTheEnd) {
@@ -295,6 +340,19 @@ TEST(VGAxisViewDraw, UnitTextStandsBesideTheArrow) {
             TextAt("mm", kSize - 15 - size.right, 10))
       << "on the other side, beyond the ticks";
   EXPECT_EQ(drawn(-200, 100, 150, TAxis_X), Pixels{}) << "its end is out of sight";
+}
+
+TEST(VGAxisViewDraw, AmpersandsAreLetters) {
+  VGAxisView view = AxisView(VGAxisDisplay_UnitText);
+  view.SetUnitText("R&D & more");
+  view.SetUnitTextAttributes(dVect2D(-150, 50), 0, 0xFFFFFF);
+  Canvas expected(kSize, kSize);
+  expected.Fill(0);
+  SetBkMode(expected, TRANSPARENT);
+  SetTextColor(expected, 0xFFFFFF);
+  tagRECT rect{70, 70, 2 * kSize, 2 * kSize};
+  DrawTextA(expected, "R&D & more", -1, &rect, DT_NOPREFIX);
+  EXPECT_EQ(Drawn(view), Lit(expected));
 }
 
 TEST(VGAxisViewDraw, UnitTextHasItsPlaceOnceItIsSet) {

@@ -248,6 +248,8 @@ TEST(VGAxisView, FormatFollowsTheUnit) {
   VGAxisView view = AxisView(1000, 5000);
   view.SetAxisUnit(&unit);
   EXPECT_EQ(FormatOf(view, 50.0), "%2.2f");
+  unit.SetUnitTrafo(0, 0.001, 3.0);
+  EXPECT_EQ(FormatOf(view, 50.0), "%1.1f") << "3.05";
   unit.SetIntegerUnit(0, true);
   EXPECT_EQ(FormatOf(view, 50.0), "%0.0f");
 }

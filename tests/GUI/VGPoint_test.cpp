@@ -153,6 +153,11 @@ TEST(VGPointView, IsDrawnAsADotWhereTheViewportShowsIt) {
   EXPECT_EQ(At(view.GetViewData()), "10 14");
   EXPECT_EQ(GetCurrentObject(canvas, OBJ_PEN), pen);
   EXPECT_EQ(RopOf(canvas), R2_COPYPEN);
+  canvas.Fill(0);
+  view.SetROPMode(R2_XORPEN);
+  view.DrawGraphic(canvas);
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas), Pixels{}) << "drawn twice, it is gone";
 }
 
 TEST(VGPointView, SelectionIsADotOfWidthFive) {

@@ -145,7 +145,7 @@ class VGAxisView::Painter {
     }
     const TextStyle style(m_dc, m_view.m_unitTextColor, TRANSPARENT, 0, m_view.m_unitFont);
     if (m_view.m_hasUnitTextPlace) {
-      Write(text, TextBox(m_dc, text, Tip() + m_view.m_unitTextPos, m_view.m_unitTextAlignment));
+      Write(text, BoxOf(text, Tip() + m_view.m_unitTextPos, m_view.m_unitTextAlignment));
     } else if (!Write(text, UnitTextBox(text, -m_side))) {
       Write(text, UnitTextBox(text, m_side));
     }
@@ -262,7 +262,7 @@ class VGAxisView::Painter {
          {std::ceil(m_first / m_step) * m_step, std::floor(m_last / m_step) * m_step}) {
       char text[kLabelSize];
       Print(text, value, m_decimals);
-      const tagRECT box = TextBox(m_dc, text, dVect2D(), 0);
+      const tagRECT box = BoxOf(text, dVect2D(), 0);
       width = std::max(width, static_cast<int>(box.right));
       height = std::max(height, static_cast<int>(box.bottom));
     }
@@ -333,15 +333,20 @@ class VGAxisView::Painter {
     std::snprintf(text, kLabelSize, "%.*f", decimals, value);
   }
 
+  /// Ampersands are letters here.
+  tagRECT BoxOf(const char* text, const dVect2D& anchor, int alignment) const {
+    return TextBox(m_dc, text, anchor, alignment, DT_NOPREFIX);
+  }
+
   /// The box of a text at a distance from the axis: below or left of it on side 1, above or right
   /// of it on side -1.
   tagRECT BoxBeside(const char* text, dVect2D pos, int side, int distance) const {
     if (m_isHorizontal) {
       pos.Add(0.0, side * distance);
-      return TextBox(m_dc, text, pos, side > 0 ? 12 : 13);
+      return BoxOf(text, pos, side > 0 ? 12 : 13);
     }
     pos.Add(-side * distance, 0.0);
-    return TextBox(m_dc, text, pos, side > 0 ? 7 : 3);
+    return BoxOf(text, pos, side > 0 ? 7 : 3);
   }
 
   /// The box of the unit text beside the arrow.
@@ -351,10 +356,10 @@ class VGAxisView::Painter {
     dVect2D pos = Tip();
     if (m_isHorizontal) {
       pos.Add(0.0, side * distance);
-      return TextBox(m_dc, text, pos, (side > 0 ? 0 : 1) | (way.x < 0.0F ? 0 : 4));
+      return BoxOf(text, pos, (side > 0 ? 0 : 1) | (way.x < 0.0F ? 0 : 4));
     }
     pos.Add(-side * distance, 0.0);
-    return TextBox(m_dc, text, pos, (side > 0 ? 4 : 0) | (way.y < 0.0F ? 0 : 1));
+    return BoxOf(text, pos, (side > 0 ? 4 : 0) | (way.y < 0.0F ? 0 : 1));
   }
 
   /// Away from the labels, or else among them. The text of a value that is seen is moved along the
