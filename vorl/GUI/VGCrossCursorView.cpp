@@ -182,6 +182,7 @@ bool VGCrossCursorView::OnRotate(dVect2D& point) {
   }
   m_first = Turned(m_startFirst, cosine, sine);
   m_second = Turned(m_startSecond, cosine, sine);
+  ViewDataChanged();
   return true;
 }
 
