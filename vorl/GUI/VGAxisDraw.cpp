@@ -9,16 +9,17 @@
 #include <vorl/GUI/VGAxis.h>
 
 #include <vorl/GUI/Trafo1D.h>
+#include <vorl/GUI/detail/AxisScale.h>
 #include <vorl/GUI/detail/ShapePen.h>
 #include <vorl/GUI/detail/ShapeText.h>
 
 #include <algorithm>
 #include <cmath>
 #include <cstdio>
-#include <utility>
 
 inline namespace vorl {
 
+using vorl_detail::AxisScale;
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
 using vorl_detail::TextBox;
@@ -34,10 +35,6 @@ constexpr int kHLMark = 9;  ///< to both sides: labels begin where it ends
 constexpr int kArrowLength = 8;
 constexpr int kArrowWidth = 4;  ///< to both sides
 constexpr int kTextGap = 2;
-/// Ticks that are closer than this, in device units, cannot be told apart.
-constexpr double kLeastDistance = 4.0;
-/// From here on neighbouring multiples of a step are not exact any more.
-constexpr double kMostSteps = 1e15;
 /// The longest number: 309 digits, as many decimals as a format has, sign and point.
 constexpr std::size_t kLabelSize = 700;
 
@@ -71,34 +68,39 @@ class VGAxisView::Painter {
       : m_dc(dc),
         m_view(view),
         m_isHorizontal(view.IsHorizontal()),
-        m_isInteger(view.m_unit != nullptr && view.m_unit->IsIntegerUnit()) {
-    view.GetValueRange(m_start, m_end);
-    m_step = view.CalcScalaValueDistance();
-    m_length = view.m_viewVector.Length();
+        m_isInteger(view.m_unit != nullptr && view.m_unit->IsIntegerUnit()),
+        m_length(view.m_viewVector.Length()),
+        m_scale(ScaleOf(view, m_length, m_isInteger)) {
     GetClipBox(dc, &m_clip);
-    ChooseSteps();
-    if (!(m_step > 0.0) || !FindShownRange()) {
-      m_step = 0.0;
-    } else if (Shows(VGAxisDisplay_Labels)) {
+    const double margin = std::abs(static_cast<double>(view.GetPenThickness())) + 1.0;
+    m_hasScale = m_scale.Step() > 0.0;
+    if (m_hasScale) {
+      // All the decimals that tell the labels apart.
+      m_decimals = view.FormatOf(m_scale.Step()).decimals;
+      m_decimals = m_isInteger ? m_decimals : std::max(m_decimals, -m_scale.Exponent());
+      m_hasScale = m_scale.Show(view.m_viewPos, view.m_viewVector, m_clip, margin);
+    }
+    if (m_hasScale && Shows(VGAxisDisplay_Labels)) {
       PlanLabels();
     }
   }
 
   void DrawTicks() const {
-    if (!Shows(VGAxisDisplay_Ticks) || m_step <= 0.0) {
+    if (!Shows(VGAxisDisplay_Ticks) || !m_hasScale) {
       return;
     }
-    if (m_parts > 1) {
+    const double mainStep = m_scale.Step();
+    if (m_scale.Parts() > 1) {
       const ColoredPen pen(m_dc, m_view, m_view.m_gray);
-      const double minorStep = m_step / m_parts;
-      ForEachStep(minorStep, [&](double step) {
-        if (std::fmod(step, m_parts) != 0.0) {
+      const double minorStep = mainStep / m_scale.Parts();
+      m_scale.ForEachStep(minorStep, [&](double step) {
+        if (std::fmod(step, m_scale.Parts()) != 0.0) {
           DrawTick(pen, step * minorStep, kMinorTick);
         }
       });
     }
     const ColoredPen pen(m_dc, m_view, static_cast<std::uint32_t>(m_view.GetPenColor()));
-    ForEachStep(m_step, [&](double step) { DrawTick(pen, step * m_step, kMainTick); });
+    m_scale.ForEachStep(mainStep, [&](double step) { DrawTick(pen, step * mainStep, kMainTick); });
   }
 
   void DrawLine() const {
@@ -117,7 +119,7 @@ class VGAxisView::Painter {
 
   void DrawHLValues() {
     for (const HLValue& hl : m_view.m_hlValues) {
-      const double t = PlaceOf(hl.value);
+      const double t = m_scale.PlaceOf(hl.value);
       if (!hl.isEnabled || !(t >= 0.0 && t <= 1.0)) {
         continue;
       }
@@ -152,16 +154,18 @@ class VGAxisView::Painter {
   }
 
   void DrawLabels() {
-    if (!Shows(VGAxisDisplay_Labels) || m_step <= 0.0) {
+    if (!Shows(VGAxisDisplay_Labels) || !m_hasScale) {
       return;
     }
     const TextStyle style(m_dc, m_view.GetPenColor(), TRANSPARENT, 0, m_view.m_labelFont);
     m_isLabel = true;
-    ForEachStep(m_step, [&](double step) {
+    const double mainStep = m_scale.Step();
+    m_scale.ForEachStep(mainStep, [&](double step) {
       if (std::fmod(step, m_stride) == 0.0) {
         char text[kLabelSize];
-        Print(text, step * m_step, m_decimals);
-        Write(text, BoxBeside(text, At(PlaceOf(step * m_step)), m_side, kMainTick + kTextGap));
+        Print(text, step * mainStep, m_decimals);
+        Write(text,
+              BoxBeside(text, At(m_scale.PlaceOf(step * mainStep)), m_side, kMainTick + kTextGap));
       }
     });
   }
@@ -202,55 +206,11 @@ class VGAxisView::Painter {
 
   dVect2D Tip() const { return m_view.m_viewPos + m_view.m_viewVector; }
 
-  /// Widens steps that are too narrow to be seen, and parts them by ticks at round values. Values
-  /// of an integer unit lie at whole numbers only.
-  void ChooseSteps() {
-    m_perValue = m_length / std::abs(m_end - m_start);
-    if (!(m_step > 0.0) || !std::isfinite(m_perValue) || !(m_perValue > 0.0)) {
-      m_step = 0.0;
-      return;
-    }
-    if (m_isInteger) {
-      m_step = std::max(m_step, 1.0);
-    }
-    while (m_step * m_perValue < kLeastDistance) {
-      m_step *= 10.0;
-    }
-    const double exponent = std::floor(std::log10(m_step * 1.001));
-    m_digit = Truncated<int>(m_step / std::pow(10.0, exponent) + 0.5);
-    int parts = m_digit == 2 ? 4 : 5;
-    while (m_isInteger && std::fmod(m_step, parts) != 0.0) {
-      --parts;
-    }
-    m_parts = m_step * m_perValue / parts >= kLeastDistance ? parts : 1;
-    // All the decimals that tell the labels apart.
-    m_decimals = m_view.FormatOf(m_step).decimals;
-    if (!m_isInteger && exponent < 0.0) {
-      m_decimals = std::max(m_decimals, Truncated<int>(-exponent));
-    }
-  }
-
-  /// Finds the values, in order, between which ticks can be seen. False where there are none.
-  bool FindShownRange() {
-    const dVect2D& pos = m_view.m_viewPos;
-    const dVect2D& way = m_view.m_viewVector;
-    const bool alongX = std::abs(way.x) >= std::abs(way.y);
-    const double margin = std::abs(static_cast<double>(m_view.GetPenThickness())) + 1.0;
-    const double low = (alongX ? m_clip.left : m_clip.top) - margin;
-    const double high = (alongX ? m_clip.right : m_clip.bottom) + margin;
-    double from = (low - (alongX ? pos.x : pos.y)) / (alongX ? way.x : way.y);
-    double to = (high - (alongX ? pos.x : pos.y)) / (alongX ? way.x : way.y);
-    if (from > to) {
-      std::swap(from, to);
-    }
-    from = std::max(from, 0.0);
-    to = std::min(to, 1.0);
-    m_first = m_start + from * (m_end - m_start);
-    m_last = m_start + to * (m_end - m_start);
-    if (m_first > m_last) {
-      std::swap(m_first, m_last);
-    }
-    return from <= to;
+  static AxisScale ScaleOf(const VGAxisView& view, double length, bool isInteger) {
+    double start = 0.0;
+    double end = 0.0;
+    view.GetValueRange(start, end);
+    return {start, end, length, view.CalcScalaValueDistance(), isInteger};
   }
 
   /// Chooses the side of the labels, and how many main ticks lead from one to the next, by the
@@ -258,8 +218,9 @@ class VGAxisView::Painter {
   void PlanLabels() {
     int width = 0;
     int height = 0;
+    const double step = m_scale.Step();
     for (const double value :
-         {std::ceil(m_first / m_step) * m_step, std::floor(m_last / m_step) * m_step}) {
+         {std::ceil(m_scale.First() / step) * step, std::floor(m_scale.Last() / step) * step}) {
       char text[kLabelSize];
       Print(text, value, m_decimals);
       const tagRECT box = BoxOf(text, dVect2D(), 0);
@@ -269,8 +230,8 @@ class VGAxisView::Painter {
     const double room = kMainTick + kTextGap + (m_isHorizontal ? height : width);
     m_side = !HasRoom(1, room) && HasRoom(-1, room) ? -1 : 1;
     const dVect2D& way = m_view.m_viewVector;
-    const double share = std::abs(m_isHorizontal ? way.x : way.y) / m_length;
-    m_stride = StrideFor((m_isHorizontal ? width : height) + kTextGap, m_step * m_perValue * share);
+    const double distance = std::abs(m_scale.LengthOf(step) * (m_isHorizontal ? way.x : way.y));
+    m_stride = m_scale.StrideFor((m_isHorizontal ? width : height) + kTextGap, distance);
   }
 
   /// Whether there is room on a side of all the axis.
@@ -285,22 +246,6 @@ class VGAxisView::Painter {
                     : std::max(pos.x, tip.x) + room <= m_clip.right;
   }
 
-  /// How many steps make a round number, and are together at least as long as an extent.
-  double StrideFor(double extent, double distance) const {
-    for (double power = 1.0; power < kMostSteps; power *= 10.0) {
-      for (const int digit : {1, 2, 5}) {
-        const double stride = digit * power / m_digit;
-        if (stride == std::floor(stride) && stride * distance >= extent) {
-          return stride;
-        }
-      }
-    }
-    return 1.0;
-  }
-
-  /// Where a value stands, in lengths of the axis.
-  double PlaceOf(double value) const { return (value - m_start) / (m_end - m_start); }
-
   dVect2D At(double t) const {
     // A hair is added, so that a place that was meant to be whole is not cut down to the one
     // before.
@@ -311,22 +256,8 @@ class VGAxisView::Painter {
     return pos;
   }
 
-  /// Calls `visit` with the number of each multiple of a step that can be seen.
-  template <class Visitor>
-  void ForEachStep(double step, Visitor&& visit) const {
-    constexpr double kHair = 1e-6;
-    const double from = std::ceil(m_first / step - kHair);
-    const double to = std::floor(m_last / step + kHair);
-    if (std::abs(from) > kMostSteps || std::abs(to) > kMostSteps) {
-      return;
-    }
-    for (double number = from; number <= to; number += 1.0) {
-      visit(number + 0.0);  // never the negative zero
-    }
-  }
-
   void DrawTick(const ColoredPen& pen, double value, int length) const {
-    pen.Across(At(PlaceOf(value)), m_isHorizontal, 0, m_side * (length + 1));
+    pen.Across(At(m_scale.PlaceOf(value)), m_isHorizontal, 0, m_side * (length + 1));
   }
 
   static void Print(char (&text)[kLabelSize], double value, int decimals) {
@@ -402,16 +333,10 @@ class VGAxisView::Painter {
   bool m_isHorizontal;
   bool m_isInteger;  ///< the unit
   tagRECT m_clip{};
-  double m_start = 0.0;
-  double m_end = 0.0;
-  double m_first = 0.0;  ///< of the values that can be seen
-  double m_last = 0.0;
-  double m_length = 0.0;
-  double m_perValue = 0.0;  ///< the length of 1 on the device
-  double m_step = 0.0;      ///< of the main ticks; 0: there is no scale
-  int m_digit = 1;          ///< its first one: 1, 2 or 5
-  int m_parts = 1;          ///< into which the shorter ticks part it
-  double m_stride = 1.0;    ///< main ticks from one label to the next
+  double m_length;
+  AxisScale m_scale;
+  bool m_hasScale = false;
+  double m_stride = 1.0;  ///< main ticks from one label to the next
   int m_decimals = 0;
   int m_side = 1;           ///< of ticks and labels; -1: above or right of the axis
   tagRECT m_taken[4] = {};  ///< by highlighted values, the unit text and the last label
