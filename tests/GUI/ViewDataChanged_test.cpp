@@ -21,8 +21,10 @@ class Recorded : public View {
  public:
   void ViewDataChanged() override {
     View::ViewDataChanged();
-    log += "op" + std::to_string(this->GetOpState()) + " rop" + std::to_string(this->GetROPMode()) +
-           (this->IsVisible() ? " seen" : " unseen") + " at " + BoxOf(*this) + "; ";
+    log += std::string("op") + std::to_string(this->GetOpState());
+    log += std::string(" rop") + std::to_string(this->GetROPMode());
+    log += this->IsVisible() ? " seen at " : " unseen at ";
+    log += BoxOf(*this) + "; ";
   }
   /// What was written since the last call.
   std::string Log() { return std::exchange(log, {}); }
@@ -93,12 +95,12 @@ TYPED_TEST(ChangesOfRects, AreToldAfterEachChange) {
   EXPECT_TRUE(view.OnCreate(kDown, 0, Hold(5, 6)));
   EXPECT_EQ(view.Log(), "op4 rop13 seen at 5 6 6 7; ");
   EXPECT_TRUE(view.OnModify(Hold(15, 26)));
-  EXPECT_EQ(view.Log(), "op4" + drawn + " seen at 5 6 15 26; ");
+  EXPECT_EQ(view.Log(), std::string("op4") + drawn + " seen at 5 6 15 26; ");
   EXPECT_TRUE(view.OnEndModify(Hold(15, 26)));
   EXPECT_TRUE(view.OnBeginMove(Hold(10, 10)));
   EXPECT_EQ(view.Log(), "");
   EXPECT_TRUE(view.OnMove(Hold(11, 12)));
-  EXPECT_EQ(view.Log(), "op0" + drawn + " seen at 6 8 16 28; ");
+  EXPECT_EQ(view.Log(), std::string("op0") + drawn + " seen at 6 8 16 28; ");
   EXPECT_TRUE(view.OnEndMove(Hold(11, 12)));
   EXPECT_EQ(view.Log(), "");
 }
