@@ -1,0 +1,300 @@
+#include <cli/Cuts.h>
+#include <cli/Mip.h>
+#include <cli/SheetView.h>
+#include <cli/Values.h>
+#include <study/Error.h>
+#include <vorl/GUI/VGAxis.h>
+#include <vorl/GUI/VGBitmapView.h>
+#include <vorl/GUI/VGCrossCursorView.h>
+#include <vorl/GUI/VGLine.h>
+#include <vorl/GUI/VGRect.h>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <cstdio>
+
+namespace cli {
+namespace {
+
+/// So much of a pixel the image is moved to the right and down: its edges are meant to lie on those
+/// of pixels, and must not be cut down to the ones before.
+constexpr double kHair = 0.02;
+constexpr float kScaleLimit = 1e6F;
+constexpr int kLinesPerTick = 4;
+constexpr int kLabelGap = 4;
+
+study::PlaneGeometry OnePixel(const study::Study& study, study::Plane plane) {
+  study::PlaneRequest request;
+  request.plane = plane;
+  request.width = request.height = 1;
+  return MakePlane(study, request);
+}
+
+tagRECT WithoutMargins(const tagRECT& rect, const Margins& margins) {
+  return {rect.left + margins.left, rect.top + margins.top, rect.right - margins.right,
+          rect.bottom - margins.bottom};
+}
+
+/// The patient's coordinate along a direction that is one of the axes, or against it.
+double SignOf(const study::Vec3& direction) {
+  return direction.x + direction.y + direction.z < 0 ? -1 : 1;
+}
+
+}  // namespace
+
+ViewExtent ExtentOf(const study::Study& study, study::Plane plane) {
+  const PlaneFrame frame(OnePixel(study, plane).coordinates);
+  const study::Extent x = study::ExtentAlong(study, frame.right);
+  const study::Extent y = study::ExtentAlong(study, frame.down);
+  return {x.maximum - x.minimum, y.maximum - y.minimum};
+}
+
+SheetView::SheetView(study::Study& study, const SheetCanvas& canvas, const ViewContent& content,
+                     const ViewPlace& place, const study::Progress& progress)
+    : m_canvas(canvas),
+      m_content(content),
+      m_place(place),
+      m_picture(WithoutMargins(place.rect, place.margins)),
+      m_frame(OnePixel(study, content.plane).coordinates),
+      m_texts(canvas, m_picture),
+      m_title(canvas, {m_picture.left, place.rect.top, m_picture.right, m_picture.top - 1}) {
+  const study::Extent x = study::ExtentAlong(study, m_frame.right);
+  const study::Extent y = study::ExtentAlong(study, m_frame.down);
+  const double halfWidth = 0.5 * static_cast<double>(m_picture.right - m_picture.left);
+  const double halfHeight = 0.5 * static_cast<double>(m_picture.bottom - m_picture.top);
+  const double middleX = 0.5 * (x.minimum + x.maximum);
+  const double middleY = 0.5 * (y.minimum + y.maximum);
+  m_shown = {middleX - halfWidth * place.mmPerPixel, middleY - halfHeight * place.mmPerPixel,
+             middleX + halfWidth * place.mmPerPixel, middleY + halfHeight * place.mmPerPixel};
+  PlaceViewPort();
+  MakeImage(study, progress);
+  AddFrame();
+}
+
+void SheetView::PlaceViewPort() {
+  const Rect2D shown(static_cast<float>(m_shown.left), static_cast<float>(m_shown.top),
+                     static_cast<float>(m_shown.right), static_cast<float>(m_shown.bottom));
+  m_viewPort.Init(shown, shown, Rect2D(m_place.rect));
+  const Margins& margins = m_place.margins;
+  m_viewPort.SetBorder(margins.left, margins.top, margins.right, margins.bottom);
+  m_viewPort.SetBgColor(static_cast<long>(colour::kPicture));
+  m_viewPort.SetBorderColor(static_cast<long>(colour::kSheet));
+  m_viewPort.SetScaleFactors(1, 1, 1 / kScaleLimit, kScaleLimit, 1 / kScaleLimit, kScaleLimit);
+  m_viewPort.UpdateTransformation();
+}
+
+// Only the pixels that meet the volume: the rest is background.
+void SheetView::MakeImage(study::Study& study, const study::Progress& progress) {
+  const double spacing = m_place.mmPerPixel;
+  const auto range = [spacing](const study::Extent& extent, double first, int count) {
+    const double low = std::floor((extent.minimum - first) / spacing + 1e-3);
+    const double high = std::ceil((extent.maximum - first) / spacing - 1e-3);
+    const int begin = static_cast<int>(std::clamp(low, 0.0, count - 1.0));
+    return std::pair(begin, static_cast<int>(std::clamp(high, begin + 1.0, double(count))));
+  };
+  const int width = static_cast<int>(m_picture.right - m_picture.left);
+  const int height = static_cast<int>(m_picture.bottom - m_picture.top);
+  const auto [left, right] =
+      range(study::ExtentAlong(study, m_frame.right), m_shown.left, width);
+  const auto [top, bottom] = range(study::ExtentAlong(study, m_frame.down), m_shown.top, height);
+
+  study::PlaneRequest plane;
+  plane.plane = m_content.plane;
+  plane.spacing = spacing;
+  plane.width = right - left;
+  plane.height = bottom - top;
+  plane.centre = m_frame.right * (m_shown.left + 0.5 * (left + right) * spacing) +
+                 m_frame.down * (m_shown.top + 0.5 * (top + bottom) * spacing) +
+                 m_frame.normal * Dot(m_content.cursor, m_frame.normal);
+  const auto cut = m_content.isProjection ? ProjectMaximum(study, {plane, true}, progress)
+                                          : CutPlane(study, {plane, true}, progress);
+  dImage levels;
+  MakePicture(*cut, m_content.display, levels);
+  m_image = levels;
+  auto& view = AddTo<VGBitmapView>(m_inside, colour::kPicture);
+  const dVect2D from = GraphicAt(left + kHair, top + kHair);
+  const dVect2D to = GraphicAt(right + kHair, bottom + kHair);
+  if (!view.Init(&m_image, from, to)) {
+    throw study::Error(std::string("can't show the picture: ") +
+                       static_cast<const char*>(view.GetStatus()));
+  }
+}
+
+/// The point of the plane at a position in the picture, in pixels from its corner.
+dVect2D SheetView::GraphicAt(double pixelX, double pixelY) const {
+  return {static_cast<float>(m_shown.left + pixelX * m_place.mmPerPixel),
+          static_cast<float>(m_shown.top + pixelY * m_place.mmPerPixel)};
+}
+
+void SheetView::AddFrame() {
+  auto& frame = AddTo<VGRectView>(m_outside, m_content.colour);
+  const double width = static_cast<double>(m_picture.right - m_picture.left);
+  const double height = static_cast<double>(m_picture.bottom - m_picture.top);
+  frame.Init(GraphicAt(-0.5, -0.5), GraphicAt(width + 0.5, height + 0.5));
+}
+
+void SheetView::Annotate(const study::Study& study) {
+  AddCursor();
+  if (m_place.hasRulers) {
+    AddRulers();
+  }
+  AddLetters();
+  AddTitle(study);
+}
+
+void SheetView::AddCursor() {
+  auto& cursor = AddTo<VGCrossCursorView>(m_inside, colour::kStrong);
+  cursor.Set(m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor));
+  cursor.SetCursorColors(static_cast<long>(m_content.acrossColour),
+                         static_cast<long>(m_content.downColour));
+}
+
+// The plane's coordinates are the patient's, or run against them.
+void SheetView::AddRulers() {
+  m_unitX.SetUnitTrafo(0, SignOf(m_frame.right), 0);
+  m_unitY.SetUnitTrafo(0, SignOf(m_frame.down), 0);
+  m_unitX.SetUnitText(0, "mm", "millimetres");
+  AddRuler(true, m_unitX);
+  AddRuler(false, m_unitY);
+}
+
+void SheetView::AddRuler(bool isHorizontal, UnitTrafo& unit) {
+  auto& ruler = AddTo<VGAxisView>(m_outside, colour::kText);
+  const double width = static_cast<double>(m_picture.right - m_picture.left);
+  const double height = static_cast<double>(m_picture.bottom - m_picture.top);
+  const double length = (isHorizontal ? width : height) * m_place.mmPerPixel;
+  ruler.Init(isHorizontal ? GraphicAt(0, height + 0.5) : GraphicAt(-0.5, 0), length,
+             isHorizontal ? TAxis_X : TAxis_Y, "");
+  ruler.SetAxisUnit(&unit);
+  ruler.SetAxisFonts(m_canvas.GetFont(), m_canvas.GetFont());
+  ruler.SetDisplayFlags(VGAxisDisplay_Ticks | VGAxisDisplay_Labels | VGAxisDisplay_UnitText);
+  ruler.DefineAxisScala(static_cast<float>(kLinesPerTick * m_canvas.GetLineHeight()), 0);
+  ruler.SetGrayColor(static_cast<long>(colour::kQuiet));
+  // The unit stands at the end of the row of labels.
+  ruler.SetUnitTextAttributes(dVect2D(0.0F, 10.0F), 4, static_cast<long>(colour::kQuiet));
+}
+
+void SheetView::AddLetters() {
+  constexpr int kInset = 4;
+  const TextLook look{colour::kStrong, true, true};
+  const auto write = [&](const study::Vec3& direction, double x, double y) {
+    const std::string letter(1, study::DirectionLetter(direction));
+    const TextSize size = m_canvas.SizeOf(letter, true);
+    const auto at = [](LONG low, LONG high, double part, int length) {
+      const double room = static_cast<double>(high - low) - 2 * kInset - length;
+      return static_cast<int>(low) + kInset + static_cast<int>(std::lround(part * room));
+    };
+    m_texts.Write(letter, at(m_picture.left, m_picture.right, x, size.width),
+                  at(m_picture.top, m_picture.bottom, y, size.height), look);
+  };
+  write(m_frame.right * -1, 0, 0.5);
+  write(m_frame.right, 1, 0.5);
+  write(m_frame.down * -1, 0.5, 0);
+  write(m_frame.down, 0.5, 1);
+}
+
+// Of the name, as much as there is room for.
+void SheetView::AddTitle(const study::Study& study) {
+  const int y = static_cast<int>(m_place.rect.top);
+  const TextLook nameLook{m_content.colour, true, false};
+  const int left = static_cast<int>(m_picture.left);
+  if (!m_title.Write(m_content.name, left, y, nameLook)) {
+    return;
+  }
+  const RealWindow& window = m_content.display.window;
+  char text[96];
+  std::snprintf(text, sizeof text, "C %s  W %s%s%s", NumberText(std::round(window.centre * 10) / 10).c_str(),
+                NumberText(std::round(window.width * 10) / 10).c_str(), study.unit.empty() ? "" : "  ", study.unit.c_str());
+  m_title.WriteBefore(text, static_cast<int>(m_picture.right), y, {});
+  if (!m_content.isProjection) {
+    const char axis = "zyx"[static_cast<int>(m_content.plane)];
+    const double position = Dot(m_content.cursor, m_frame.normal) * SignOf(m_frame.normal);
+    std::snprintf(text, sizeof text, "%c = %.1f mm", axis, position);
+    const int gap = m_canvas.GetLineHeight() / 2;
+    m_title.Write(text, left + m_canvas.SizeOf(m_content.name, true).width + gap, y, {});
+  }
+}
+
+tagRECT SheetView::PixelsOf(const PlaneRect& rect) const {
+  Rect2D view(static_cast<float>(rect.left), static_cast<float>(rect.top),
+              static_cast<float>(rect.right), static_cast<float>(rect.bottom));
+  m_viewPort.GraphicToView(view);
+  const auto pixel = [](float position) { return static_cast<LONG>(std::floor(position)); };
+  return {pixel(view.GetTL().x), pixel(view.GetTL().y), pixel(view.GetBR().x) + 1,
+          pixel(view.GetBR().y) + 1};
+}
+
+void SheetView::Show(const Measured& measured) {
+  if (measured.line) {
+    AddLine(measured);
+  }
+  if (measured.region) {
+    AddRegion(measured);
+  }
+}
+
+void SheetView::AddLine(const Measured& measured) {
+  const auto& [start, end] = *measured.line;
+  auto& line = AddTo<VGLineView>(m_inside, colour::kMeasured);
+  line.Init(dVect2D(static_cast<float>(start.x), static_cast<float>(start.y)),
+            dVect2D(static_cast<float>(end.x), static_cast<float>(end.y)), TLine_Segment);
+  line.Select(true);
+  WriteLabel(measured.lineText,
+             PixelsOf({std::min(start.x, end.x), std::min(start.y, end.y),
+                       std::max(start.x, end.x), std::max(start.y, end.y)}));
+}
+
+void SheetView::AddRegion(const Measured& measured) {
+  const PlaneRect& region = *measured.region;
+  auto& rect = AddTo<VGRectView>(m_inside, colour::kMeasured);
+  rect.Init(static_cast<float>(region.left), static_cast<float>(region.top),
+            static_cast<float>(region.right), static_cast<float>(region.bottom));
+  WriteLabel(measured.regionText, PixelsOf(region));
+}
+
+// First where it covers no line of the cursor, then where it may.
+void SheetView::WriteLabel(const std::string& text, const tagRECT& object) {
+  m_texts.Take(object);
+  const TextSize size = m_canvas.SizeOf(text);
+  const int middleX = static_cast<int>(object.left + object.right - size.width) / 2;
+  const int middleY = static_cast<int>(object.top + object.bottom - size.height) / 2;
+  const std::array<std::array<int, 2>, 4> places{
+      {{middleX, static_cast<int>(object.top) - kLabelGap - size.height},
+       {middleX, static_cast<int>(object.bottom) + kLabelGap},
+       {static_cast<int>(object.right) + kLabelGap, middleY},
+       {static_cast<int>(object.left) - kLabelGap - size.width, middleY}}};
+  const tagRECT cursor = PixelsOf({m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor),
+                                   m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor)});
+  for (const bool mayCover : {false, true}) {
+    for (const auto& [x, y] : places) {
+      const bool covers = (x <= cursor.left && cursor.left < x + size.width) ||
+                          (y <= cursor.top && cursor.top < y + size.height);
+      if ((mayCover || !covers) && m_texts.Write(text, x, y, {colour::kMeasured, false, true})) {
+        return;
+      }
+    }
+  }
+}
+
+void SheetView::Draw() {
+  const HDC dc = m_canvas.GetDC();
+  {
+    const SavedState state(dc);
+    m_viewPort.EraseBkgnd(dc, nullptr, false);
+  }
+  {
+    const SavedState state(dc);
+    m_viewPort.Draw(dc, &m_inside, nullptr, false);
+  }
+  {
+    const SavedState state(dc);
+    m_viewPort.ClipBorders(false);
+    m_viewPort.Draw(dc, &m_outside, nullptr, false);
+    m_viewPort.ClipBorders(true);
+  }
+  m_texts.Draw();
+  m_title.Draw();
+}
+
+}  // namespace cli
