@@ -1,17 +1,15 @@
 #include <cli/Measurements.h>
 #include <cli/Render.h>
 #include <cli/Tissue.h>
+#include <cli/Values.h>
 #include <vorl/GUI/VGLine.h>
-
-#include <cstdio>
 
 namespace cli {
 namespace {
 
 std::string Fixed(double value, const std::string& unit) {
-  char text[64];
-  std::snprintf(text, sizeof text, "%.1f", value);
-  return unit.empty() ? text : text + (" " + unit);
+  std::string text = FixedText(value, 1);
+  return unit.empty() ? text : text.append(" ").append(unit);
 }
 
 double LengthOf(const PlaneLine& line) {
@@ -55,8 +53,9 @@ Measured Measure(study::Study& study, const MeasureRequest& request, ResultTable
   if (statistics.count > 0) {
     results.emplace_back("Mean", Fixed(statistics.mean, study.unit));
     results.emplace_back("SD", Fixed(statistics.deviation, study.unit));
-    results.emplace_back(
-        "Range", Fixed(statistics.minimum, {}) + " to " + Fixed(statistics.maximum, study.unit));
+    results.emplace_back("Range", NumberText(statistics.minimum) + " to " +
+                                      NumberText(statistics.maximum) +
+                                      (study.unit.empty() ? "" : " ") + study.unit);
     measured.regionText = "Mean " + Fixed(statistics.mean, study.unit) + "\nSD " +
                           Fixed(statistics.deviation, study.unit);
   }

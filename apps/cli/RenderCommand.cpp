@@ -69,8 +69,7 @@ RenderCommand::RenderCommand(CLI::App& application)
   AddText("--line", m_line, "X,Y,X,Y",
           "The ends of the measured line in mm (default: across\nthe body)", kMeasureGroup);
   AddText("--region", m_region, "X,Y,X,Y",
-          "Two corners of the rectangle in mm (default: an even\npart of the body)",
-          kMeasureGroup);
+          "Two corners of the rectangle in mm (default: an even\npart of the body)", kMeasureGroup);
   m_grey.AddTo(GetApp(), "the input's own window, else auto;\nthe projection's is then auto");
 }
 
@@ -170,9 +169,11 @@ void RenderCommand::Run(Console& console) {
   study::Study& study = *input.study;
   m_sheet.cursor = m_measure.cursor = m_cursor.value_or(MiddleOf(study));
   m_sheet.display = m_grey.Resolve(study, console);
-  m_sheet.projectionWindow =
-      m_grey.WantsAuto() ? ProjectionWindow(study) : m_sheet.display.window;
+  m_sheet.projectionWindow = m_grey.WantsAuto() ? ProjectionWindow(study) : m_sheet.display.window;
   if (m_sheet.isAnnotated) {
+    const study::Vec3& cross = m_sheet.cursor;
+    m_sheet.results.emplace_back("Planes", FixedText(cross.x, 1) + ", " + FixedText(cross.y, 1) +
+                                               ", " + FixedText(cross.z, 1) + " mm");
     m_sheet.measured =
         Measure(study, m_measure, m_sheet.results, study::PartOf(progress, 0.5, 0.6));
   }

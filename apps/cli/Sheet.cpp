@@ -14,7 +14,7 @@ namespace {
 
 constexpr int kTicks = 8 + 2 + 4;  ///< of a ruler, and gaps
 constexpr double kLabelsAcross = 10;
-constexpr double kHistogramShape = 0.9;  ///< height by width, at most
+constexpr double kHistogramShape = 1.6;  ///< height by width, at most
 constexpr double kTableShare = 0.3;      ///< of a panel that lies below
 constexpr int kTableLine = 4;            ///< thirds of the text's height
 
@@ -84,12 +84,11 @@ void DrawHeader(const study::Study& study, const SheetCanvas& canvas, const tagR
   const std::string title = study.description.empty() ? "Volume" : study.description;
   const int y = static_cast<int>(rect.top) + canvas.GetLineHeight() / 4;
   texts.Write(title, static_cast<int>(rect.left), y, {colour::kStrong, true, false});
-  texts.WriteBefore(std::to_string(study.volume.GetSizeX()) + " x " +
-                        std::to_string(study.volume.GetSizeY()) + " x " +
-                        std::to_string(study.volume.GetSizeZ()) + " voxels of " +
-                        spacing(place.axisX) + " x " + spacing(place.axisY) + " x " +
-                        spacing(place.axisZ) + " mm",
-                    static_cast<int>(rect.right), y, {});
+  texts.WriteBefore(
+      std::to_string(study.volume.GetSizeX()) + " x " + std::to_string(study.volume.GetSizeY()) +
+          " x " + std::to_string(study.volume.GetSizeZ()) + " voxels of " + spacing(place.axisX) +
+          " x " + spacing(place.axisY) + " x " + spacing(place.axisZ) + " mm",
+      static_cast<int>(rect.right), y, {});
   texts.Draw();
 }
 
@@ -102,9 +101,8 @@ void DrawTable(const ResultTable& results, const SheetCanvas& canvas, const tagR
   texts.Write("Measurements", left, y, {colour::kStrong, true, false});
   for (const auto& [name, value] : results) {
     y += canvas.GetLineHeight() * kTableLine / 3;
-    if (!texts.Write(name, left, y, {colour::kQuiet, false, false}) ||
-        !texts.WriteBefore(value, right, y, {})) {
-      break;
+    if (texts.WriteBefore(value, right, y, {})) {
+      texts.Write(name, left, y, {colour::kQuiet, false, false});
     }
   }
   texts.Draw();
@@ -117,8 +115,7 @@ void DrawPanel(const study::Study& study, const SheetContent& content, const She
   const LONG width = panel.right - panel.left;
   const LONG height = panel.bottom - panel.top;
   const int line = canvas.GetLineHeight();
-  const LONG tableHeight =
-      static_cast<LONG>(content.results.size() + 2) * line * kTableLine / 3;
+  const LONG tableHeight = static_cast<LONG>(content.results.size() + 2) * line * kTableLine / 3;
   if (height > width) {
     histogram.bottom =
         std::min({panel.top + static_cast<LONG>(std::lround(kHistogramShape * double(width))),

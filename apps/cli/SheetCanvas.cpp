@@ -28,8 +28,8 @@ SheetCanvas::SheetCanvas(int width, int height)
     DeleteDC(m_dc);
     DeleteObject(m_font);
     DeleteObject(m_bold);
-    throw study::Error("there is not enough memory for a sheet of " + std::to_string(width) + " x " +
-                       std::to_string(height) + " pixels");
+    throw study::Error("there is not enough memory for a sheet of " + std::to_string(width) +
+                       " x " + std::to_string(height) + " pixels");
   }
   m_lineHeight = std::max(1, SizeOf("Mg").height);
 }

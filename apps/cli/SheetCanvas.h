@@ -25,7 +25,7 @@ inline constexpr COLORREF kStrong = 0xEBE8E6;
 inline constexpr COLORREF kAxial = 0x6464DC;
 inline constexpr COLORREF kCoronal = 0x78B95F;
 inline constexpr COLORREF kSagittal = 0xE69B5A;
-inline constexpr COLORREF kMeasured = 0x5AC8F5;
+inline constexpr COLORREF kMeasured = 0x30AAFF;
 }  // namespace colour
 
 /// What a text takes, in pixels.

@@ -76,6 +76,7 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
   m_last += margin;
   PlaceViewPort();
   AddCurve(counts);
+  AddFrame();
   AddWindow(study.StoredValue(window.centre - 0.5 * window.width),
             study.StoredValue(window.centre + 0.5 * window.width));
   AddAxis(study);
@@ -113,6 +114,14 @@ void SheetHistogram::AddCurve(const Histogram& counts) {
     curve.SetData(static_cast<float>(m_first + 0.5 * step), static_cast<float>(step), columns,
                   heights.data(), CurveStorageMode_Copy);
   }
+}
+
+void SheetHistogram::AddFrame() {
+  const double x = 0.5 * (m_last - m_first) / static_cast<double>(m_picture.right - m_picture.left);
+  const double y = 0.5 * kAir / static_cast<double>(m_picture.bottom - m_picture.top);
+  AddTo<VGRectView>(m_outside, colour::kFrame)
+      .Init(static_cast<float>(m_first - x), static_cast<float>(-kAir - y),
+            static_cast<float>(m_last + x), static_cast<float>(y));
 }
 
 void SheetHistogram::AddWindow(double low, double high) {

@@ -18,9 +18,9 @@ namespace cli {
 /// How many voxels have which value, as a curve over an axis with real values, and the window as a
 /// line from black to white.
 ///
-/// *Scaling.* Heights are logarithmic: air around a body counts a thousand times as much as an organ
-/// and leaves it visible nevertheless. The axis leaves out one voxel in 100,000 at either end.
-/// Graphic coordinates are stored values, and heights from 0 to -1, the upper end.
+/// *Scaling.* Heights are logarithmic: air around a body counts a thousand times as much as an
+/// organ and leaves it visible nevertheless. The axis leaves out one voxel in 100,000 at either
+/// end. Graphic coordinates are stored values, and heights from 0 to -1, the upper end.
 class SheetHistogram {
  public:
   /// `canvas` must outlive this.
@@ -31,6 +31,7 @@ class SheetHistogram {
  private:
   void PlaceViewPort();
   void AddCurve(const Histogram& counts);
+  void AddFrame();
   void AddWindow(double low, double high);
   void AddAxis(const study::Study& study);
 

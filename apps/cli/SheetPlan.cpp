@@ -7,8 +7,9 @@
 
 // 1. Choose what stands around the pictures: all of it, or less where they would become too small.
 // 2. Take header and panel away from the sheet; what is left is the block of the views.
-// 3. Find the scale at which the views fit into the block, which follows from its tighter direction.
-// 4. Give the panel what the block does not need in the other direction, and spread the rest.
+// 3. Find the scale at which the views fit into the block, which follows from its tighter
+// direction.
+// 4. Give the panel what the block does not need in the other direction, and some to the pictures.
 
 namespace cli {
 namespace {
@@ -19,14 +20,19 @@ constexpr std::array<std::pair<const char*, SheetLayout>, 4> kLayouts{
      {"column", SheetLayout::Column},
      {"main", SheetLayout::Main}}};
 
-constexpr int kFrame = 1;          ///< the outline of a picture
+constexpr int kFrame = 1;              ///< the outline of a picture
 constexpr double kPanelBeside = 0.24;  ///< of the sheet's width, at least
 constexpr double kPanelBelow = 0.2;    ///< of its height, at least
-constexpr double kLargestPanel = 0.42;
-constexpr double kSmallMain = 0.36;  ///< of the block: the small views beside the large one, at most
+constexpr double kLargestPanel = 0.36;
+/// Pictures get so much more than what they show needs where there is room.
+constexpr double kMostSlack = 0.4;
+constexpr double kSmallMain =
+    0.36;  ///< of the block: the small views beside the large one, at most
 /// Views are made as if they were this much of the longest one: there must be room for text.
 constexpr double kLeastShare = 0.3;
-constexpr int kLeastPicture = 9;  ///< lines of text, in either direction
+/// What a picture must be for the annotations to stay, in lines of text.
+constexpr int kLeastWidth = 9;
+constexpr int kLeastHeight = 6;
 
 struct Furniture {
   bool header, panel, rulers, titles;
@@ -114,7 +120,8 @@ class Planner {
   bool Plan() {
     tagRECT block{m_gap, m_gap, m_request.width - m_gap, m_request.height - m_gap};
     if (m_furniture.header) {
-      m_plan.header = {block.left, block.top, block.right, block.top + m_request.lineHeight * 3 / 2};
+      m_plan.header = {block.left, block.top, block.right,
+                       block.top + m_request.lineHeight * 3 / 2};
       block.top = m_plan.header.bottom + m_gap;
     }
     if (m_furniture.panel) {
@@ -192,24 +199,30 @@ class Planner {
     return extent / std::max(pixels, count);
   }
 
-  /// The borders between tracks: each gets what it needs, and an equal share of the rest.
-  std::vector<LONG> Borders(const std::vector<double>& tracks, LONG begin, int length, int margins,
-                            double scale, LONG& used) const {
+  /// Where the tracks of one direction begin and end. Each gets what it needs and some of the rest;
+  /// what remains of that is left on both sides.
+  std::vector<std::pair<LONG, LONG>> Spans(const std::vector<double>& tracks, LONG begin,
+                                           int length, int margins, double scale,
+                                           LONG& used) const {
     const int count = static_cast<int>(tracks.size());
-    int needed = (count - 1) * m_gap;
+    const auto pixels = [scale](double track) { return std::ceil(track / scale - 1e-6); };
+    double pictures = 0;
     for (const double track : tracks) {
-      needed += static_cast<int>(std::ceil(track / scale - 1e-6)) + margins;
+      pictures += pixels(track);
     }
-    used = begin + std::min(needed, length);
-    const double more = std::max(0.0, static_cast<double>(length - needed) / count);
-    std::vector<LONG> borders{begin};
-    double at = static_cast<double>(begin);
+    const double needed = pictures + count * margins + (count - 1) * m_gap;
+    used = begin + static_cast<LONG>(std::min(needed, static_cast<double>(length)));
+    const double rest = std::max(0.0, length - needed);
+    const double more = std::min(rest, kMostSlack * pictures);
+    double at = static_cast<double>(begin) + std::floor(0.5 * (rest - more));
+    std::vector<std::pair<LONG, LONG>> spans;
     for (const double track : tracks) {
-      at += std::ceil(track / scale - 1e-6) + margins + more + m_gap;
-      borders.push_back(static_cast<LONG>(std::floor(at)));
+      const double size = pixels(track) * (1 + more / pictures) + margins;
+      spans.emplace_back(static_cast<LONG>(std::floor(at)),
+                         std::min(static_cast<LONG>(std::floor(at + size)), begin + length));
+      at += size + m_gap;
     }
-    borders.back() = begin + length + m_gap;
-    return borders;
+    return spans;
   }
 
   /// Places the views of a grid; returns the part of the block that they need.
@@ -219,22 +232,21 @@ class Planner {
     const double scale = std::max(Scale(columns, Width(block), HorizontalMargins()),
                                   Scale(rows, Height(block), VerticalMargins()));
     tagRECT used = block;
-    const std::vector<LONG> x = Borders(columns, block.left, Width(block), HorizontalMargins(),
-                                        scale, used.right);
-    const std::vector<LONG> y =
-        Borders(rows, block.top, Height(block), VerticalMargins(), scale, used.bottom);
+    const auto x = Spans(columns, block.left, Width(block), HorizontalMargins(), scale, used.right);
+    const auto y = Spans(rows, block.top, Height(block), VerticalMargins(), scale, used.bottom);
     for (const Grid::Cell& cell : grid.cells) {
-      m_plan.views[cell.view] = {x[cell.column], y[cell.row], x[cell.column + 1] - m_gap,
-                                 y[cell.row + 1] - m_gap};
+      m_plan.views[cell.view] = {x[cell.column].first, y[cell.row].first, x[cell.column].second,
+                                 y[cell.row].second};
       m_plan.mmPerPixel[cell.view] = scale;
     }
     return used;
   }
 
   bool IsLargeEnough() const {
-    const int least = kLeastPicture * m_request.lineHeight;
+    const int line = m_request.lineHeight;
     return std::all_of(m_plan.views.begin(), m_plan.views.end(), [&](const tagRECT& view) {
-      return Width(view) - HorizontalMargins() >= least && Height(view) - VerticalMargins() >= least;
+      return Width(view) - HorizontalMargins() >= kLeastWidth * line &&
+             Height(view) - VerticalMargins() >= kLeastHeight * line;
     });
   }
 

@@ -66,8 +66,8 @@ struct SheetPlan {
 };
 
 /// Plans a sheet. All pictures but the large one of `SheetLayout::Main` have the same millimetres
-/// per pixel. The panel stands beside the views or below them, where it leaves the first one larger.
-/// On small sheets the header goes first, then the panel, then the rulers.
+/// per pixel. The panel stands beside the views or below them, where it leaves the first one
+/// larger. On small sheets the header goes first, then the panel, then the rulers.
 SheetPlan PlanSheet(const SheetRequest& request);
 
 /// Nothing lies in it.

@@ -1,5 +1,6 @@
 #include <cli/Cuts.h>
 #include <cli/Mip.h>
+#include <cli/Resample.h>
 #include <cli/SheetView.h>
 #include <cli/Values.h>
 #include <study/Error.h>
@@ -10,9 +11,10 @@
 #include <vorl/GUI/VGRect.h>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <cstdio>
+#include <utility>
+#include <vector>
 
 namespace cli {
 namespace {
@@ -84,7 +86,8 @@ void SheetView::PlaceViewPort() {
   m_viewPort.UpdateTransformation();
 }
 
-// Only the pixels that meet the volume: the rest is background.
+// Only the pixels that meet the volume: the rest is background. The plane is sampled at the voxels,
+// and then interpolated for the pixels.
 void SheetView::MakeImage(study::Study& study, const study::Progress& progress) {
   const double spacing = m_place.mmPerPixel;
   const auto range = [spacing](const study::Extent& extent, double first, int count) {
@@ -95,23 +98,26 @@ void SheetView::MakeImage(study::Study& study, const study::Progress& progress) 
   };
   const int width = static_cast<int>(m_picture.right - m_picture.left);
   const int height = static_cast<int>(m_picture.bottom - m_picture.top);
-  const auto [left, right] =
-      range(study::ExtentAlong(study, m_frame.right), m_shown.left, width);
+  const auto [left, right] = range(study::ExtentAlong(study, m_frame.right), m_shown.left, width);
   const auto [top, bottom] = range(study::ExtentAlong(study, m_frame.down), m_shown.top, height);
 
   study::PlaneRequest plane;
   plane.plane = m_content.plane;
-  plane.spacing = spacing;
-  plane.width = right - left;
-  plane.height = bottom - top;
-  plane.centre = m_frame.right * (m_shown.left + 0.5 * (left + right) * spacing) +
-                 m_frame.down * (m_shown.top + 0.5 * (top + bottom) * spacing) +
-                 m_frame.normal * Dot(m_content.cursor, m_frame.normal);
-  const auto cut = m_content.isProjection ? ProjectMaximum(study, {plane, true}, progress)
-                                          : CutPlane(study, {plane, true}, progress);
+  plane.centre = m_content.cursor;
+  plane.spacing = 1 / VoxelsPerMillimetre(study, m_frame.right);
+  plane.spacingDown = 1 / VoxelsPerMillimetre(study, m_frame.down);
+  const study::Progress part = study::PartOf(progress, 0, 0.8);
+  const auto cut = m_content.isProjection ? ProjectMaximum(study, {plane}, part)
+                                          : CutPlane(study, {plane}, part);
+  const auto picture = Resample(*cut,
+                                {m_shown.left + left * spacing, m_shown.top + top * spacing,
+                                 spacing, right - left, bottom - top},
+                                study::PartOf(progress, 0.8, 1));
   dImage levels;
-  MakePicture(*cut, m_content.display, levels);
+  MakePicture(*picture, m_content.display, levels);
   m_image = levels;
+  m_imageLeft = left;
+  m_imageTop = top;
   auto& view = AddTo<VGBitmapView>(m_inside, colour::kPicture);
   const dVect2D from = GraphicAt(left + kHair, top + kHair);
   const dVect2D to = GraphicAt(right + kHair, bottom + kHair);
@@ -204,13 +210,15 @@ void SheetView::AddTitle(const study::Study& study) {
   }
   const RealWindow& window = m_content.display.window;
   char text[96];
-  std::snprintf(text, sizeof text, "C %s  W %s%s%s", NumberText(std::round(window.centre * 10) / 10).c_str(),
-                NumberText(std::round(window.width * 10) / 10).c_str(), study.unit.empty() ? "" : "  ", study.unit.c_str());
+  std::snprintf(text, sizeof text, "C %s  W %s%s%s",
+                NumberText(std::round(window.centre * 10) / 10).c_str(),
+                NumberText(std::round(window.width * 10) / 10).c_str(),
+                study.unit.empty() ? "" : "  ", study.unit.c_str());
   m_title.WriteBefore(text, static_cast<int>(m_picture.right), y, {});
   if (!m_content.isProjection) {
     const char axis = "zyx"[static_cast<int>(m_content.plane)];
     const double position = Dot(m_content.cursor, m_frame.normal) * SignOf(m_frame.normal);
-    std::snprintf(text, sizeof text, "%c = %.1f mm", axis, position);
+    std::snprintf(text, sizeof text, "%c = %s mm", axis, FixedText(position, 1).c_str());
     const int gap = m_canvas.GetLineHeight() / 2;
     m_title.Write(text, left + m_canvas.SizeOf(m_content.name, true).width + gap, y, {});
   }
@@ -226,53 +234,98 @@ tagRECT SheetView::PixelsOf(const PlaneRect& rect) const {
 }
 
 void SheetView::Show(const Measured& measured) {
-  if (measured.line) {
-    AddLine(measured);
+  const std::optional<tagRECT> line =
+      measured.line ? std::optional(AddLine(*measured.line)) : std::nullopt;
+  const std::optional<tagRECT> region =
+      measured.region ? std::optional(AddRegion(*measured.region)) : std::nullopt;
+  if (line) {
+    WriteLabel(measured.lineText, *line);
   }
-  if (measured.region) {
-    AddRegion(measured);
+  if (region) {
+    WriteLabel(measured.regionText, *region);
   }
 }
 
-void SheetView::AddLine(const Measured& measured) {
-  const auto& [start, end] = *measured.line;
+/// Lines grow with the text.
+int SheetView::PenWidth() const {
+  constexpr int kTextPerPixel = 18;
+  return std::max(1, m_canvas.GetLineHeight() / kTextPerPixel);
+}
+
+tagRECT SheetView::AddLine(const PlaneLine& measured) {
+  const auto& [start, end] = measured;
   auto& line = AddTo<VGLineView>(m_inside, colour::kMeasured);
   line.Init(dVect2D(static_cast<float>(start.x), static_cast<float>(start.y)),
             dVect2D(static_cast<float>(end.x), static_cast<float>(end.y)), TLine_Segment);
+  line.SetPenThickness(PenWidth());
   line.Select(true);
-  WriteLabel(measured.lineText,
-             PixelsOf({std::min(start.x, end.x), std::min(start.y, end.y),
-                       std::max(start.x, end.x), std::max(start.y, end.y)}));
+  const tagRECT place = PixelsOf({std::min(start.x, end.x), std::min(start.y, end.y),
+                                  std::max(start.x, end.x), std::max(start.y, end.y)});
+  m_texts.Take(place);
+  return place;
 }
 
-void SheetView::AddRegion(const Measured& measured) {
-  const PlaneRect& region = *measured.region;
+tagRECT SheetView::AddRegion(const PlaneRect& region) {
   auto& rect = AddTo<VGRectView>(m_inside, colour::kMeasured);
+  rect.SetPenThickness(PenWidth());
   rect.Init(static_cast<float>(region.left), static_cast<float>(region.top),
             static_cast<float>(region.right), static_cast<float>(region.bottom));
-  WriteLabel(measured.regionText, PixelsOf(region));
+  m_texts.Take(PixelsOf(region));
+  return PixelsOf(region);
 }
 
-// First where it covers no line of the cursor, then where it may.
-void SheetView::WriteLabel(const std::string& text, const tagRECT& object) {
-  m_texts.Take(object);
-  const TextSize size = m_canvas.SizeOf(text);
-  const int middleX = static_cast<int>(object.left + object.right - size.width) / 2;
-  const int middleY = static_cast<int>(object.top + object.bottom - size.height) / 2;
-  const std::array<std::array<int, 2>, 4> places{
-      {{middleX, static_cast<int>(object.top) - kLabelGap - size.height},
-       {middleX, static_cast<int>(object.bottom) + kLabelGap},
-       {static_cast<int>(object.right) + kLabelGap, middleY},
-       {static_cast<int>(object.left) - kLabelGap - size.width, middleY}}};
-  const tagRECT cursor = PixelsOf({m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor),
-                                   m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor)});
-  for (const bool mayCover : {false, true}) {
-    for (const auto& [x, y] : places) {
-      const bool covers = (x <= cursor.left && cursor.left < x + size.width) ||
-                          (y <= cursor.top && cursor.top < y + size.height);
-      if ((mayCover || !covers) && m_texts.Write(text, x, y, {colour::kMeasured, false, true})) {
-        return;
+/// How bright the picture is below a rectangle of the sheet, 0 to 255.
+double SheetView::Brightness(const tagRECT& rect) const {
+  const int width = static_cast<int>(m_image.GetWidth());
+  const int height = static_cast<int>(m_image.GetHeight());
+  double sum = 0;
+  for (LONG y = rect.top; y < rect.bottom; ++y) {
+    for (LONG x = rect.left; x < rect.right; ++x) {
+      const int i = static_cast<int>(x - m_picture.left) - m_imageLeft;
+      const int j = static_cast<int>(y - m_picture.top) - m_imageTop;
+      if (i >= 0 && i < width && j >= 0 && j < height) {
+        sum += static_cast<const unsigned char*>(m_image.GetRowPtr(j))[i];
       }
+    }
+  }
+  return sum / std::max(1.0, static_cast<double>(rect.right - rect.left) *
+                                 static_cast<double>(rect.bottom - rect.top));
+}
+
+// Where it hides as little as possible: a dark part of the picture, and no line of the cursor.
+void SheetView::WriteLabel(const std::string& text, const tagRECT& object) {
+  constexpr double kHidesCursor = 256;
+  const TextSize size = m_canvas.SizeOf(text);
+  const int left = static_cast<int>(object.left);
+  const int top = static_cast<int>(object.top);
+  const int right = static_cast<int>(object.right);
+  const int bottom = static_cast<int>(object.bottom);
+  struct Place {
+    double cost;
+    int x, y;
+  };
+  std::vector<Place> places;
+  for (const int x : {(left + right - size.width) / 2, left, right - size.width}) {
+    places.push_back({0, x, top - kLabelGap - size.height});
+    places.push_back({0, x, bottom + kLabelGap});
+  }
+  for (const int y : {(top + bottom - size.height) / 2, top, bottom - size.height}) {
+    places.push_back({0, right + kLabelGap, y});
+    places.push_back({0, left - kLabelGap - size.width, y});
+  }
+  const PlanePoint at{m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor)};
+  const tagRECT cursor = PixelsOf({at.x, at.y, at.x, at.y});
+  for (Place& place : places) {
+    const bool hides = (place.x <= cursor.left && cursor.left < place.x + size.width) ||
+                       (place.y <= cursor.top && cursor.top < place.y + size.height);
+    place.cost = Brightness({place.x, place.y, place.x + size.width, place.y + size.height}) +
+                 (hides ? kHidesCursor : 0);
+  }
+  std::stable_sort(places.begin(), places.end(),
+                   [](const Place& a, const Place& b) { return a.cost < b.cost; });
+  for (const Place& place : places) {
+    if (m_texts.Write(text, place.x, place.y, {colour::kMeasured, false, true})) {
+      return;
     }
   }
 }

@@ -51,8 +51,8 @@ struct Measured {
 };
 
 /// A picture in its viewport, whose graphic coordinates are those of its plane in millimetres: the
-/// image, sampled once for each pixel of the sheet, and what is drawn over and around it. Nothing is
-/// seen before `Draw`.
+/// image, sampled once for each pixel of the sheet, and what is drawn over and around it. Nothing
+/// is seen before `Draw`.
 class SheetView {
  public:
   /// Cuts the picture. `canvas` must outlive this. Throws `study::Error`.
@@ -74,8 +74,10 @@ class SheetView {
   void AddRuler(bool isHorizontal, UnitTrafo& unit);
   void AddLetters();
   void AddTitle(const study::Study& study);
-  void AddLine(const Measured& measured);
-  void AddRegion(const Measured& measured);
+  int PenWidth() const;
+  tagRECT AddLine(const PlaneLine& measured);
+  tagRECT AddRegion(const PlaneRect& region);
+  double Brightness(const tagRECT& rect) const;
   void WriteLabel(const std::string& text, const tagRECT& object);
   dVect2D GraphicAt(double pixelX, double pixelY) const;
   tagRECT PixelsOf(const PlaneRect& rect) const;
@@ -83,11 +85,13 @@ class SheetView {
   const SheetCanvas& m_canvas;
   ViewContent m_content;
   ViewPlace m_place;
-  tagRECT m_picture{};    ///< without the margins
+  tagRECT m_picture{};  ///< without the margins
   study::PlaneGeometry m_plane;
   PlaneFrame m_frame;
-  PlaneRect m_shown;      ///< what `m_picture` shows
+  PlaneRect m_shown;  ///< what `m_picture` shows
   dDIB m_image;
+  int m_imageLeft = 0;  ///< its place in `m_picture`
+  int m_imageTop = 0;
   UnitTrafo m_unitX, m_unitY;
   GraphicHandler m_inside;   ///< what is clipped to the picture
   GraphicHandler m_outside;  ///< what is not

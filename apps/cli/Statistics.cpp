@@ -37,9 +37,9 @@ Statistics StatisticsOf(const study::Study& cut, const PlaneRect& rect) {
       if (grid.CentreX(i) < rect.left || grid.CentreX(i) >= rect.right) {
         continue;
       }
-      const double value = cut.RealValue(
-          samples[static_cast<std::size_t>(j) * static_cast<std::size_t>(grid.width) +
-                  static_cast<std::size_t>(i)]);
+      const double value =
+          cut.RealValue(samples[static_cast<std::size_t>(j) * static_cast<std::size_t>(grid.width) +
+                                static_cast<std::size_t>(i)]);
       if (result.count == 0) {
         first = result.minimum = result.maximum = value;
       }

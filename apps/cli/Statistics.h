@@ -57,7 +57,8 @@ struct PixelGrid {
 struct Statistics {
   std::size_t count = 0;
   double mean = 0;
-  double deviation = 0;  ///< the standard deviation: the root of the mean squared distance to `mean`
+  double deviation =
+      0;  ///< the standard deviation: the root of the mean squared distance to `mean`
   double minimum = 0;
   double maximum = 0;
 };

@@ -12,13 +12,14 @@ constexpr double kLineAbove = 0.2;   ///< of the body's height
 constexpr double kRectWidth = 0.16;  ///< of the body's width
 constexpr double kRectShape = 0.75;  ///< height by width
 constexpr double kDistance = 0.02;   ///< from the lines, of the body's width
-constexpr double kSmaller = 0.7;
+constexpr double kSmaller = 0.75;
+constexpr double kEven = 0.02;    ///< deviation by contrast, from which on a rectangle is even
 constexpr int kSmallestRect = 3;  ///< pixels
 
 }  // namespace
 
-/// Sums over rectangles in four steps: of body pixels, their samples and the squares of those. All
-/// are whole numbers, which are exact up to 2^53.
+/// Sums over rectangles in four steps: of bright pixels, their samples and the squares of those.
+/// All are whole numbers, which are exact up to 2^53.
 class Tissue::Sums {
  public:
   explicit Sums(const Tissue& tissue)
@@ -30,15 +31,15 @@ class Tissue::Sums {
       Sum row;
       for (int i = 0; i < tissue.m_grid.width; ++i) {
         const std::size_t at = tissue.At(i, j);
-        const double value = tissue.m_body[at] != 0 ? samples[at] : 0;
-        row += {static_cast<double>(tissue.m_body[at]), value, value * value};
+        const double value = tissue.m_bright[at] != 0 ? samples[at] : 0;
+        row += {static_cast<double>(tissue.m_bright[at]), value, value * value};
         m_sums[At(i + 1, j + 1)] = m_sums[At(i + 1, j)];
         m_sums[At(i + 1, j + 1)] += row;
       }
     }
   }
 
-  /// The variance of the samples; negative unless all pixels are the body's.
+  /// The variance of the samples; negative unless all pixels are bright.
   double Variance(const Box& box) const {
     Sum sum = m_sums[At(box.right, box.bottom)];
     sum += m_sums[At(box.left, box.top)];
@@ -81,17 +82,24 @@ class Tissue::Sums {
 
 Tissue::Tissue(const study::Study& cut) : m_cut(cut), m_grid(cut) {
   MarkBright();
-  KeepLargestArea();
+  FindBody();
 }
 
 void Tissue::MarkBright() {
   const std::uint16_t dark = PartingValue(HistogramOf(m_cut));
+  double sums[2] = {0, 0};
+  double counts[2] = {0, 0};
   for (const std::uint16_t sample : study::SamplesOf(*m_cut.volume.GetSliceList().begin())) {
-    m_body.push_back(sample > dark ? 1 : 0);
+    const std::uint8_t isBright = sample > dark ? 1 : 0;
+    m_bright.push_back(isBright);
+    sums[isBright] += sample;
+    counts[isBright] += 1;
   }
+  m_contrast = sums[1] / std::max(counts[1], 1.0) - sums[0] / std::max(counts[0], 1.0);
 }
 
-void Tissue::KeepLargestArea() {
+void Tissue::FindBody() {
+  m_body = m_bright;
   std::vector<std::uint32_t> areas(m_body.size());  // each pixel's number, 0 for none yet
   std::vector<std::size_t> open;
   std::uint32_t count = 0;
@@ -161,58 +169,61 @@ std::optional<PlaneLine> Tissue::LineAcross(const PlanePoint& cursor) const {
   }
   const double wanted = (cursor.y - m_grid.top) / m_grid.spacing -
                         kLineAbove * static_cast<double>(m_box.bottom - m_box.top);
-  const int row = static_cast<int>(std::clamp(std::floor(wanted), double(m_box.top),
-                                              double(m_box.bottom - 1)));
+  const int row =
+      static_cast<int>(std::clamp(std::floor(wanted), double(m_box.top), double(m_box.bottom - 1)));
   const auto begin = m_body.begin() + static_cast<std::ptrdiff_t>(At(0, row));
   const auto end = begin + m_grid.width;
   const auto first = std::find(begin, end, 1) - begin;
-  const auto behind = std::find(std::make_reverse_iterator(end), std::make_reverse_iterator(begin), 1)
-                          .base() - begin;
+  const auto behind =
+      std::find(std::make_reverse_iterator(end), std::make_reverse_iterator(begin), 1).base() -
+      begin;
   const double y = m_grid.CentreY(row);
   return PlaneLine{{m_grid.left + static_cast<double>(first) * m_grid.spacing, y},
                    {m_grid.left + static_cast<double>(behind) * m_grid.spacing, y}};
 }
 
-std::optional<PlaneRect> Tissue::EvenRect(const Sums& sums, int width, int height,
-                                          const PlanePoint& cursor,
-                                          const std::optional<PlaneLine>& line) const {
+Tissue::Candidate Tissue::MostEven(const Sums& sums, int width, int height,
+                                   const PlanePoint& cursor,
+                                   const std::optional<PlaneLine>& line) const {
   const double distance = kDistance * (m_box.right - m_box.left) * m_grid.spacing;
-  const auto isNear = [distance](double position, double low, double high) {
+  const auto isClose = [distance](double position, double low, double high) {
     return position > low - distance && position < high + distance;
   };
-  double best = std::numeric_limits<double>::infinity();
-  std::optional<PlaneRect> found;
+  Candidate best;
   for (int j = m_box.top; j + height <= m_box.bottom; ++j) {
     for (int i = m_box.left; i + width <= m_box.right; ++i) {
       const Box box{i, j, i + width, j + height};
       const double variance = sums.Variance(box);
-      if (variance < 0 || variance >= best) {
+      if (variance < 0 || variance >= best.variance) {
         continue;
       }
       const PlaneRect rect = RectOf(box);
-      if (isNear(cursor.x, rect.left, rect.right) || isNear(cursor.y, rect.top, rect.bottom) ||
-          (line && isNear(line->start.y, rect.top, rect.bottom))) {
-        continue;
+      if (!isClose(cursor.x, rect.left, rect.right) && !isClose(cursor.y, rect.top, rect.bottom) &&
+          !(line && isClose(line->start.y, rect.top, rect.bottom))) {
+        best = {rect, variance};
       }
-      best = variance;
-      found = rect;
     }
   }
-  return found;
+  return best;
 }
 
 std::optional<PlaneRect> Tissue::EvenRect(const PlanePoint& cursor,
                                           const std::optional<PlaneLine>& line) const {
   const Sums sums(*this);
+  Candidate best;
   for (double width = kRectWidth * (m_box.right - m_box.left); width >= kSmallestRect;
        width *= kSmaller) {
     const int columns = static_cast<int>(std::lround(width));
     const int rows = std::max(1, static_cast<int>(std::lround(width * kRectShape)));
-    if (const auto rect = EvenRect(sums, columns, rows, cursor, line)) {
-      return rect;
+    const Candidate candidate = MostEven(sums, columns, rows, cursor, line);
+    if (candidate.variance < best.variance) {
+      best = candidate;
+    }
+    if (best.variance <= kEven * kEven * m_contrast * m_contrast) {
+      break;
     }
   }
-  return std::nullopt;
+  return best.rect;
 }
 
 }  // namespace cli

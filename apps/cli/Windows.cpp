@@ -161,8 +161,7 @@ TableWindow PlaceWindow(const RealWindow& window, const study::Study& study) {
   placed.centre = static_cast<int>(std::lround(tableCentre));
   // A centre that fits is rounded, not compensated: samples are whole numbers as well.
   placed.shift = tableCentre == centre ? 0 : tableCentre - centre;
-  placed.width =
-      static_cast<int>(std::lround(std::clamp(width * placed.factor, 2.0, kValues)));
+  placed.width = static_cast<int>(std::lround(std::clamp(width * placed.factor, 2.0, kValues)));
   return placed;
 }
 
