@@ -1,3 +1,4 @@
+#include <cli/Cuts.h>
 #include <cli/Measurements.h>
 #include <cli/Render.h>
 #include <cli/Tissue.h>
@@ -24,9 +25,8 @@ double LengthOf(const PlaneLine& line) {
 
 Measured Measure(study::Study& study, const MeasureRequest& request, ResultTable& results,
                  const study::Progress& progress) {
-  CutRequest plane;
-  plane.plane.centre = request.cursor;
-  const auto cut = CutPlane(study, plane, progress);
+  const auto cut =
+      CutPlane(study, {VoxelPlane(study, study::Plane::Axial, request.cursor)}, progress);
   Measured measured{request.line, {}, request.region, {}};
   if (!measured.line || !measured.region) {
     const Tissue tissue(*cut);

@@ -27,8 +27,8 @@ struct MeasureRequest {
 };
 
 /// Measures on the axial plane through the cursor. Lengths follow from the coordinates; statistics
-/// are those of the voxels that the plane meets: it is sampled at the nearest voxels, at the
-/// distance of the smallest voxel spacing. Throws `study::Error`.
+/// are those of the voxels that the plane meets, whose centres lie in the rectangle. Throws
+/// `study::Error`.
 Measured Measure(study::Study& study, const MeasureRequest& request, ResultTable& results,
                  const study::Progress& progress);
 

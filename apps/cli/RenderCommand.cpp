@@ -151,6 +151,19 @@ study::Vec3 MiddleOf(const study::Study& study) {
   return study::ToVec3(MakePlane(study, pixel).coordinates.origin);
 }
 
+/// Tells which planes show nothing.
+void TellMissed(const study::Study& study, const study::Vec3& centre, Console& console) {
+  const auto tell = [&](const char* name, const study::Vec3& normal) {
+    const study::Extent extent = study::ExtentAlong(study, normal);
+    if (Dot(centre, normal) < extent.minimum || Dot(centre, normal) > extent.maximum) {
+      console.Note(std::string("the ") + name + " plane does not meet the volume");
+    }
+  };
+  tell("axial", {0, 0, 1});
+  tell("coronal", {0, 1, 0});
+  tell("sagittal", {1, 0, 0});
+}
+
 std::string TextOf(const ResultTable& results) {
   constexpr std::size_t kColumn = 14;
   std::string text;
@@ -168,6 +181,7 @@ void RenderCommand::Run(Console& console) {
   const Input input = m_input.Load(console, study::PartOf(progress, 0, 0.5));
   study::Study& study = *input.study;
   m_sheet.cursor = m_measure.cursor = m_cursor.value_or(MiddleOf(study));
+  TellMissed(study, m_sheet.cursor, console);
   m_sheet.display = m_grey.Resolve(study, console);
   m_sheet.projectionWindow = m_grey.WantsAuto() ? ProjectionWindow(study) : m_sheet.display.window;
   if (m_sheet.isAnnotated) {

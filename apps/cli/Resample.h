@@ -21,8 +21,8 @@ struct PixelRaster {
 };
 
 /// The cut interpolated for other pixels of its plane, first along its rows and then along its
-/// columns. Points within half a pixel of the cut's left and upper edges, and outside, are 0.
-/// Throws `study::Error`.
+/// columns. From the centres of the outermost pixels to the cut's edges
+/// it goes on as it is there; half a pixel further out it is 0. Throws `study::Error`.
 ///
 /// The reconstruction's own interpolation goes wrong at edges where a point lies between voxels in
 /// both directions of a slice at once; in one direction at a time it is exact.

@@ -101,11 +101,7 @@ void SheetView::MakeImage(study::Study& study, const study::Progress& progress) 
   const auto [left, right] = range(study::ExtentAlong(study, m_frame.right), m_shown.left, width);
   const auto [top, bottom] = range(study::ExtentAlong(study, m_frame.down), m_shown.top, height);
 
-  study::PlaneRequest plane;
-  plane.plane = m_content.plane;
-  plane.centre = m_content.cursor;
-  plane.spacing = 1 / VoxelsPerMillimetre(study, m_frame.right);
-  plane.spacingDown = 1 / VoxelsPerMillimetre(study, m_frame.down);
+  const study::PlaneRequest plane = VoxelPlane(study, m_content.plane, m_content.cursor);
   const study::Progress part = study::PartOf(progress, 0, 0.8);
   const auto cut = m_content.isProjection ? ProjectMaximum(study, {plane}, part)
                                           : CutPlane(study, {plane}, part);
@@ -183,6 +179,11 @@ void SheetView::AddRuler(bool isHorizontal, UnitTrafo& unit) {
 
 void SheetView::AddLetters() {
   constexpr int kInset = 4;
+  constexpr int kLeastLines = 5;
+  if (std::min(m_picture.right - m_picture.left, m_picture.bottom - m_picture.top) <
+      kLeastLines * m_canvas.GetLineHeight()) {
+    return;
+  }
   const TextLook look{colour::kStrong, true, true};
   const auto write = [&](const study::Vec3& direction, double x, double y) {
     const std::string letter(1, study::DirectionLetter(direction));

@@ -12,6 +12,7 @@ PlaneFrame::PlaneFrame(const dCoordSys3D& plane)
 
 PixelGrid::PixelGrid(const study::Study& cut)
     : spacing(Length(study::ToVec3(cut.volume.GetCoordinates().axisX))),
+      spacingDown(Length(study::ToVec3(cut.volume.GetCoordinates().axisY))),
       width(cut.volume.GetSizeX()),
       height(cut.volume.GetSizeY()) {
   const PlaneFrame frame(cut.volume.GetCoordinates());
@@ -24,7 +25,7 @@ PixelGrid::PixelGrid(const study::Study& cut)
 // lose the small digits.
 Statistics StatisticsOf(const study::Study& cut, const PlaneRect& rect) {
   const PixelGrid grid(cut);
-  const auto samples = study::SamplesOf(*cut.volume.GetSliceList().begin());
+  const auto samples = study::SamplesOf(cut.volume.GetSliceList().front());
   Statistics result;
   double first = 0;
   double sum = 0;

@@ -39,18 +39,19 @@ struct PlaneRect {
   double bottom = 0;
 };
 
-/// The pixels of a cut: pixel (i, j) covers `spacing` from (left + i * spacing, top + j * spacing).
+/// The pixels of a cut: pixel (i, j) begins at (left + i * spacing, top + j * spacingDown).
 struct PixelGrid {
   double left = 0;
   double top = 0;
   double spacing = 1;
+  double spacingDown = 1;
   int width = 0;
   int height = 0;
 
   /// Of a cut as `CutPlane` makes it.
   explicit PixelGrid(const study::Study& cut);
   double CentreX(int i) const { return left + (i + 0.5) * spacing; }
-  double CentreY(int j) const { return top + (j + 0.5) * spacing; }
+  double CentreY(int j) const { return top + (j + 0.5) * spacingDown; }
 };
 
 /// Real values of samples.

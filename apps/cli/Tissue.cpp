@@ -26,7 +26,7 @@ class Tissue::Sums {
       : m_columns(tissue.m_grid.width + 1),
         m_sums(static_cast<std::size_t>(m_columns) *
                static_cast<std::size_t>(tissue.m_grid.height + 1)) {
-    const auto samples = study::SamplesOf(*tissue.m_cut.volume.GetSliceList().begin());
+    const auto samples = study::SamplesOf(tissue.m_cut.volume.GetSliceList().front());
     for (int j = 0; j < tissue.m_grid.height; ++j) {
       Sum row;
       for (int i = 0; i < tissue.m_grid.width; ++i) {
@@ -89,7 +89,7 @@ void Tissue::MarkBright() {
   const std::uint16_t dark = PartingValue(HistogramOf(m_cut));
   double sums[2] = {0, 0};
   double counts[2] = {0, 0};
-  for (const std::uint16_t sample : study::SamplesOf(*m_cut.volume.GetSliceList().begin())) {
+  for (const std::uint16_t sample : study::SamplesOf(m_cut.volume.GetSliceList().front())) {
     const std::uint8_t isBright = sample > dark ? 1 : 0;
     m_bright.push_back(isBright);
     sums[isBright] += sample;
@@ -159,7 +159,7 @@ void Tissue::FindBody() {
 
 PlaneRect Tissue::RectOf(const Box& box) const {
   const auto x = [this](int i) { return m_grid.left + i * m_grid.spacing; };
-  const auto y = [this](int j) { return m_grid.top + j * m_grid.spacing; };
+  const auto y = [this](int j) { return m_grid.top + j * m_grid.spacingDown; };
   return {x(box.left), y(box.top), x(box.right), y(box.bottom)};
 }
 
@@ -167,7 +167,7 @@ std::optional<PlaneLine> Tissue::LineAcross(const PlanePoint& cursor) const {
   if (m_box.right <= m_box.left) {
     return std::nullopt;
   }
-  const double wanted = (cursor.y - m_grid.top) / m_grid.spacing -
+  const double wanted = (cursor.y - m_grid.top) / m_grid.spacingDown -
                         kLineAbove * static_cast<double>(m_box.bottom - m_box.top);
   const int row =
       static_cast<int>(std::clamp(std::floor(wanted), double(m_box.top), double(m_box.bottom - 1)));
@@ -214,7 +214,8 @@ std::optional<PlaneRect> Tissue::EvenRect(const PlanePoint& cursor,
   for (double width = kRectWidth * (m_box.right - m_box.left); width >= kSmallestRect;
        width *= kSmaller) {
     const int columns = static_cast<int>(std::lround(width));
-    const int rows = std::max(1, static_cast<int>(std::lround(width * kRectShape)));
+    const double height = width * kRectShape * m_grid.spacing / m_grid.spacingDown;
+    const int rows = std::max(1, static_cast<int>(std::lround(height)));
     const Candidate candidate = MostEven(sums, columns, rows, cursor, line);
     if (candidate.variance < best.variance) {
       best = candidate;
