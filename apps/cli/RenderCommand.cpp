@@ -6,6 +6,7 @@
 #include <cli/Sheet.h>
 #include <cli/Values.h>
 
+#include <algorithm>
 #include <cmath>
 #include <optional>
 
@@ -75,16 +76,14 @@ RenderCommand::RenderCommand(CLI::App& application)
 
 std::vector<double> RenderCommand::Corners(const std::string& option,
                                            const std::string& text) const {
-  std::vector<double> numbers = SplitNumbers(text);
-  for (const double number : numbers) {
-    if (std::abs(number) > kFarthestMm) {
-      numbers.clear();
-      break;
-    }
-  }
+  const std::vector<double> numbers = SplitNumbers(text);
   if (numbers.size() != 4) {
     throw UsageError(option + ": " + study::Quoted(text) +
                      " is not X,Y,X,Y (four numbers with commas between them)");
+  }
+  if (std::any_of(numbers.begin(), numbers.end(),
+                  [](double number) { return std::abs(number) > kFarthestMm; })) {
+    throw UsageError(option + ": " + study::Quoted(text) + " is not within a kilometre");
   }
   if (m_plain) {
     throw UsageError(option + " and --no-annotations exclude each other");
