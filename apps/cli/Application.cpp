@@ -16,7 +16,8 @@ namespace {
 
 constexpr char kDescription[] =
     "vorl looks at image volumes: it tells what is in a DICOM series, cuts planes out of\n"
-    "it, projects it, lists its brightest voxels, and converts it into study files.\n\n"
+    "it, projects it, draws sheets for reports, lists its brightest voxels, and converts it\n"
+    "into study files.\n\n"
     "An INPUT is a folder with a DICOM series, the files of one, or a study file (.bdf);\n"
     "--phantom stands for a built-in torso.";
 constexpr char kFooter[] =

@@ -13,7 +13,7 @@ constexpr double kRectWidth = 0.16;  ///< of the body's width
 constexpr double kRectShape = 0.75;  ///< height by width
 constexpr double kDistance = 0.02;   ///< from the lines, of the body's width
 constexpr double kSmaller = 0.75;
-constexpr double kEven = 0.02;    ///< deviation by contrast, from which on a rectangle is even
+constexpr double kEven = 0.01;    ///< deviation by contrast, from which on a rectangle is even
 constexpr int kSmallestRect = 3;  ///< pixels
 
 }  // namespace
