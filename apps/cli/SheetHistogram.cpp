@@ -1,5 +1,4 @@
 #include <cli/SheetHistogram.h>
-#include <cli/SheetPlan.h>
 #include <vorl/GUI/VGAxis.h>
 #include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGLine.h>
@@ -14,11 +13,10 @@ namespace cli {
 namespace {
 
 constexpr double kTail = 1e-5;
-constexpr double kMargin = 0.02;  ///< of the values, at both ends
-constexpr double kAir = 1.06;     ///< the upper end, in heights of the curve
-constexpr float kScaleLimit = 1e6F;
+constexpr double kMargin = 0.02;         ///< of the values, at both ends
+constexpr double kAir = 1.06;            ///< the upper end, in heights of the curve
 constexpr int kRulerLength = 8 + 2 + 3;  ///< ticks and gaps
-constexpr int kWidestLabels = 6;         ///< in lines, from label to label
+constexpr int kWidestLabels = 4;         ///< in lines, from label to label
 constexpr COLORREF kBars = 0x5F5752;
 
 /// The first and the last stored value that matter.
@@ -68,6 +66,7 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
                                const SheetCanvas& canvas, const tagRECT& rect)
     : m_canvas(canvas),
       m_rect(rect),
+      m_viewPort(canvas),
       m_title(canvas, {rect.left, rect.top, rect.right, rect.top + canvas.GetLineHeight() + 1}) {
   const Histogram counts = HistogramOf(study);
   FindEnds(counts, m_first, m_last);
@@ -89,17 +88,10 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
 void SheetHistogram::PlaceViewPort() {
   const int line = m_canvas.GetLineHeight();
   const Margins margins{1, line + line / 3, 1, line + kRulerLength};
-  m_picture = {m_rect.left + margins.left, m_rect.top + margins.top, m_rect.right - margins.right,
-               m_rect.bottom - margins.bottom};
-  const Rect2D shown(static_cast<float>(m_first), static_cast<float>(-kAir),
-                     static_cast<float>(m_last), 0.0F);
-  m_viewPort.Init(shown, shown, Rect2D(m_rect));
-  m_viewPort.SetBorder(margins.left, margins.top, margins.right, margins.bottom);
-  m_viewPort.SetBgColor(static_cast<long>(colour::kPicture));
-  m_viewPort.SetBorderColor(static_cast<long>(colour::kSheet));
-  m_viewPort.SetProportional(false);
-  m_viewPort.SetScaleFactors(1, 1, 1 / kScaleLimit, kScaleLimit, 1 / kScaleLimit, kScaleLimit);
-  m_viewPort.UpdateTransformation();
+  m_picture = WithoutMargins(m_rect, margins);
+  m_viewPort.Place(Rect2D(static_cast<float>(m_first), static_cast<float>(-kAir),
+                          static_cast<float>(m_last), 0.0F),
+                   m_rect, margins, false);
 }
 
 // One bar and one point of the outline for each column of pixels.
@@ -108,7 +100,7 @@ void SheetHistogram::AddCurve(const Histogram& counts) {
   const double step = (m_last - m_first) / columns;
   std::vector<float> heights = Heights(counts, m_first, step, columns);
   for (const bool isOutline : {false, true}) {
-    auto& curve = AddTo<VGCurveView>(m_inside, isOutline ? colour::kText : kBars);
+    auto& curve = AddTo<VGCurveView>(m_viewPort.Inside(), isOutline ? colour::kText : kBars);
     curve.SetPenThickness(1);
     curve.SetDrawMode(isOutline ? CurveDrawMode_Polyline : CurveDrawMode_Bars);
     curve.SetData(static_cast<float>(m_first + 0.5 * step), static_cast<float>(step), columns,
@@ -119,14 +111,14 @@ void SheetHistogram::AddCurve(const Histogram& counts) {
 void SheetHistogram::AddFrame() {
   const double x = 0.5 * (m_last - m_first) / static_cast<double>(m_picture.right - m_picture.left);
   const double y = 0.5 * kAir / static_cast<double>(m_picture.bottom - m_picture.top);
-  AddTo<VGRectView>(m_outside, colour::kFrame)
+  AddTo<VGRectView>(m_viewPort.Around(), colour::kFrame)
       .Init(static_cast<float>(m_first - x), static_cast<float>(-kAir - y),
             static_cast<float>(m_last + x), static_cast<float>(y));
 }
 
 void SheetHistogram::AddWindow(double low, double high) {
   const auto add = [this](double x1, double y1, double x2, double y2, int style) {
-    auto& line = AddTo<VGLineView>(m_inside, colour::kMeasured);
+    auto& line = AddTo<VGLineView>(m_viewPort.Inside(), colour::kMeasured);
     line.SetPenStyle(style);
     line.Init(dVect2D(static_cast<float>(x1), static_cast<float>(y1)),
               dVect2D(static_cast<float>(x2), static_cast<float>(y2)), TLine_Segment);
@@ -140,7 +132,7 @@ void SheetHistogram::AddAxis(const study::Study& study) {
   m_unit.SetUnitTrafo(0, study.scale, study.offset);
   m_unit.SetUnitText(0, study.unit.c_str(), study.unit.c_str());
   const double below = 0.5 * kAir / static_cast<double>(m_picture.bottom - m_picture.top);
-  auto& axis = AddTo<VGAxisView>(m_outside, colour::kText);
+  auto& axis = AddTo<VGAxisView>(m_viewPort.Around(), colour::kText);
   axis.Init(dVect2D(static_cast<float>(m_first), static_cast<float>(below)), m_last - m_first,
             TAxis_X, "");
   axis.SetAxisUnit(&m_unit);
@@ -153,20 +145,7 @@ void SheetHistogram::AddAxis(const study::Study& study) {
 }
 
 void SheetHistogram::Draw() {
-  const HDC dc = m_canvas.GetDC();
-  {
-    const SavedState state(dc);
-    m_viewPort.EraseBkgnd(dc, nullptr, false);
-  }
-  {
-    const SavedState state(dc);
-    m_viewPort.Draw(dc, &m_inside, nullptr, false);
-  }
-  {
-    const SavedState state(dc);
-    m_viewPort.ClipBorders(false);
-    m_viewPort.Draw(dc, &m_outside, nullptr, false);
-  }
+  m_viewPort.Draw();
   m_title.Draw();
 }
 

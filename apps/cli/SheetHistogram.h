@@ -6,11 +6,10 @@
 
 #include <cli/Histogram.h>
 #include <cli/SheetCanvas.h>
+#include <cli/SheetViewPort.h>
 #include <cli/TextLayer.h>
 #include <cli/Windows.h>
 #include <study/Study.h>
-#include <vorl/GUI/GraphicHandler.h>
-#include <vorl/GUI/GraphicViewPort.h>
 #include <vorl/GUI/Trafo1D.h>
 
 namespace cli {
@@ -41,9 +40,8 @@ class SheetHistogram {
   double m_first = 0;   ///< the stored values at the ends
   double m_last = 1;
   UnitTrafo m_unit;
-  GraphicHandler m_inside, m_outside;
+  SheetViewPort m_viewPort;
   TextLayer m_title;
-  GraphicViewPort m_viewPort;
 };
 
 }  // namespace cli

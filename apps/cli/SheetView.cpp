@@ -20,7 +20,6 @@ namespace {
 /// So much of a pixel the image is moved to the right and down: its edges are meant to lie on those
 /// of pixels, and must not be cut down to the ones before.
 constexpr double kHair = 0.02;
-constexpr float kScaleLimit = 1e6F;
 constexpr int kLinesPerTick = 4;
 
 study::PlaneGeometry OnePixel(const study::Study& study, study::Plane plane) {
@@ -28,11 +27,6 @@ study::PlaneGeometry OnePixel(const study::Study& study, study::Plane plane) {
   request.plane = plane;
   request.width = request.height = 1;
   return MakePlane(study, request);
-}
-
-tagRECT WithoutMargins(const tagRECT& rect, const Margins& margins) {
-  return {rect.left + margins.left, rect.top + margins.top, rect.right - margins.right,
-          rect.bottom - margins.bottom};
 }
 
 /// The patient's coordinate along a direction that is one of the axes, or against it.
@@ -56,6 +50,7 @@ SheetView::SheetView(study::Study& study, const SheetCanvas& canvas, const ViewC
       m_place(place),
       m_picture(WithoutMargins(place.rect, place.margins)),
       m_frame(OnePixel(study, content.plane).coordinates),
+      m_viewPort(canvas),
       m_texts(canvas, m_picture),
       m_title(canvas, {m_picture.left, place.rect.top, m_picture.right, m_picture.top - 1}) {
   const study::Extent x = study::ExtentAlong(study, m_frame.right);
@@ -66,21 +61,11 @@ SheetView::SheetView(study::Study& study, const SheetCanvas& canvas, const ViewC
   const double middleY = 0.5 * (y.minimum + y.maximum);
   m_shown = {middleX - halfWidth * place.mmPerPixel, middleY - halfHeight * place.mmPerPixel,
              middleX + halfWidth * place.mmPerPixel, middleY + halfHeight * place.mmPerPixel};
-  PlaceViewPort();
+  m_viewPort.Place(Rect2D(static_cast<float>(m_shown.left), static_cast<float>(m_shown.top),
+                          static_cast<float>(m_shown.right), static_cast<float>(m_shown.bottom)),
+                   place.rect, place.margins, true);
   MakeImage(study, progress);
   AddFrame();
-}
-
-void SheetView::PlaceViewPort() {
-  const Rect2D shown(static_cast<float>(m_shown.left), static_cast<float>(m_shown.top),
-                     static_cast<float>(m_shown.right), static_cast<float>(m_shown.bottom));
-  m_viewPort.Init(shown, shown, Rect2D(m_place.rect));
-  const Margins& margins = m_place.margins;
-  m_viewPort.SetBorder(margins.left, margins.top, margins.right, margins.bottom);
-  m_viewPort.SetBgColor(static_cast<long>(colour::kPicture));
-  m_viewPort.SetBorderColor(static_cast<long>(colour::kSheet));
-  m_viewPort.SetScaleFactors(1, 1, 1 / kScaleLimit, kScaleLimit, 1 / kScaleLimit, kScaleLimit);
-  m_viewPort.UpdateTransformation();
 }
 
 // Only the pixels that meet the volume: the rest is background. The plane is sampled at the voxels,
@@ -111,7 +96,7 @@ void SheetView::MakeImage(study::Study& study, const study::Progress& progress) 
   m_image = levels;
   m_imageLeft = left;
   m_imageTop = top;
-  auto& view = AddTo<VGBitmapView>(m_inside, colour::kPicture);
+  auto& view = AddTo<VGBitmapView>(m_viewPort.Inside(), colour::kPicture);
   const dVect2D from = GraphicAt(left + kHair, top + kHair);
   const dVect2D to = GraphicAt(right + kHair, bottom + kHair);
   if (!view.Init(&m_image, from, to)) {
@@ -127,7 +112,7 @@ dVect2D SheetView::GraphicAt(double pixelX, double pixelY) const {
 }
 
 void SheetView::AddFrame() {
-  auto& frame = AddTo<VGRectView>(m_outside, m_content.colour);
+  auto& frame = AddTo<VGRectView>(m_viewPort.Around(), m_content.colour);
   const double width = static_cast<double>(m_picture.right - m_picture.left);
   const double height = static_cast<double>(m_picture.bottom - m_picture.top);
   frame.Init(GraphicAt(-0.5, -0.5), GraphicAt(width + 0.5, height + 0.5));
@@ -143,7 +128,7 @@ void SheetView::Annotate(const study::Study& study) {
 }
 
 void SheetView::AddCursor() {
-  auto& cursor = AddTo<VGCrossCursorView>(m_inside, colour::kStrong);
+  auto& cursor = AddTo<VGCrossCursorView>(m_viewPort.Inside(), colour::kStrong);
   cursor.Set(m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor));
   cursor.SetCursorColors(static_cast<long>(m_content.acrossColour),
                          static_cast<long>(m_content.downColour));
@@ -160,7 +145,7 @@ void SheetView::AddRulers() {
 
 // Beside the frame.
 void SheetView::AddRuler(bool isHorizontal, UnitTrafo& unit) {
-  auto& ruler = AddTo<VGAxisView>(m_outside, colour::kText);
+  auto& ruler = AddTo<VGAxisView>(m_viewPort.Around(), colour::kText);
   const double width = static_cast<double>(m_picture.right - m_picture.left);
   const double height = static_cast<double>(m_picture.bottom - m_picture.top);
   const double length = (isHorizontal ? width : height) * m_place.mmPerPixel;
@@ -224,21 +209,7 @@ void SheetView::AddTitle(const study::Study& study) {
 }
 
 void SheetView::Draw() {
-  const HDC dc = m_canvas.GetDC();
-  {
-    const SavedState state(dc);
-    m_viewPort.EraseBkgnd(dc, nullptr, false);
-  }
-  {
-    const SavedState state(dc);
-    m_viewPort.Draw(dc, &m_inside, nullptr, false);
-  }
-  {
-    const SavedState state(dc);
-    m_viewPort.ClipBorders(false);
-    m_viewPort.Draw(dc, &m_outside, nullptr, false);
-    m_viewPort.ClipBorders(true);
-  }
+  m_viewPort.Draw();
   m_texts.Draw();
   m_title.Draw();
 }

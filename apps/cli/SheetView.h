@@ -7,14 +7,13 @@
 #include <cli/Render.h>
 #include <cli/SheetCanvas.h>
 #include <cli/SheetPlan.h>
+#include <cli/SheetViewPort.h>
 #include <cli/Statistics.h>
 #include <cli/TextLayer.h>
 #include <study/Planes.h>
 #include <study/Progress.h>
 #include <study/Study.h>
 #include <vorl/Data/dDIB.h>
-#include <vorl/GUI/GraphicHandler.h>
-#include <vorl/GUI/GraphicViewPort.h>
 #include <vorl/GUI/Trafo1D.h>
 
 #include <optional>
@@ -66,7 +65,6 @@ class SheetView {
   void Draw();
 
  private:
-  void PlaceViewPort();
   void MakeImage(study::Study& study, const study::Progress& progress);
   void AddFrame();
   void AddCursor();
@@ -93,10 +91,8 @@ class SheetView {
   int m_imageLeft = 0;  ///< its place in `m_picture`
   int m_imageTop = 0;
   UnitTrafo m_unitX, m_unitY;
-  GraphicHandler m_inside;   ///< what is clipped to the picture
-  GraphicHandler m_outside;  ///< what is not
+  SheetViewPort m_viewPort;
   TextLayer m_texts, m_title;
-  GraphicViewPort m_viewPort;  ///< goes first: it refers to the layers
 };
 
 /// What a view must show of a study for all of it to be seen.

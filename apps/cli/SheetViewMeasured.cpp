@@ -17,7 +17,7 @@ constexpr int kLabelGap = 4;
 tagRECT SheetView::PixelsOf(const PlaneRect& rect) const {
   Rect2D view(static_cast<float>(rect.left), static_cast<float>(rect.top),
               static_cast<float>(rect.right), static_cast<float>(rect.bottom));
-  m_viewPort.GraphicToView(view);
+  m_viewPort.GetViewPort().GraphicToView(view);
   const auto pixel = [](float position) { return static_cast<LONG>(std::floor(position)); };
   return {pixel(view.GetTL().x), pixel(view.GetTL().y), pixel(view.GetBR().x) + 1,
           pixel(view.GetBR().y) + 1};
@@ -44,7 +44,7 @@ int SheetView::PenWidth() const {
 
 tagRECT SheetView::AddLine(const PlaneLine& measured) {
   const auto& [start, end] = measured;
-  auto& line = AddTo<VGLineView>(m_inside, colour::kMeasured);
+  auto& line = AddTo<VGLineView>(m_viewPort.Inside(), colour::kMeasured);
   line.Init(dVect2D(static_cast<float>(start.x), static_cast<float>(start.y)),
             dVect2D(static_cast<float>(end.x), static_cast<float>(end.y)), TLine_Segment);
   line.SetPenThickness(PenWidth());
@@ -56,7 +56,7 @@ tagRECT SheetView::AddLine(const PlaneLine& measured) {
 }
 
 tagRECT SheetView::AddRegion(const PlaneRect& region) {
-  auto& rect = AddTo<VGRectView>(m_inside, colour::kMeasured);
+  auto& rect = AddTo<VGRectView>(m_viewPort.Inside(), colour::kMeasured);
   rect.SetPenThickness(PenWidth());
   rect.Init(static_cast<float>(region.left), static_cast<float>(region.top),
             static_cast<float>(region.right), static_cast<float>(region.bottom));
