@@ -58,6 +58,7 @@ SheetPlan MakePlan(const study::Study& study, const SheetContent& content, const
   request.layout = content.layout;
   request.isAnnotated = content.isAnnotated;
   request.lineHeight = canvas.GetLineHeight();
+  request.penWidth = canvas.GetPenWidth();
   request.rulerWidth = LabelWidth(study, canvas) + kTicks;
   request.rulerHeight = canvas.GetLineHeight() + kTicks;
   for (std::size_t i = 0; i < kViewCount; ++i) {

@@ -8,6 +8,7 @@ namespace {
 
 constexpr int kSmallestText = 11;  ///< pixels; smaller ones can't be read
 constexpr int kSheetPerText = 72;
+constexpr int kTextPerPen = 18;
 
 HFONT MakeFont(int height, int weight) {
   return CreateFontA(-height, 0, 0, 0, weight, 0, 0, 0, DEFAULT_CHARSET, OUT_DEFAULT_PRECIS,
@@ -47,6 +48,10 @@ TextSize SheetCanvas::SizeOf(const std::string& text, bool isBold) const {
   DrawTextA(m_dc, text.c_str(), -1, &box, DT_CALCRECT);
   SelectObject(m_dc, old);
   return {static_cast<int>(box.right), static_cast<int>(box.bottom)};
+}
+
+int SheetCanvas::GetPenWidth() const {
+  return std::max(1, m_lineHeight / kTextPerPen);
 }
 
 const dImage& SheetCanvas::GetPicture() const {

@@ -46,6 +46,8 @@ class SheetCanvas {
   HDC GetDC() const { return m_dc; }
   HFONT GetFont(bool isBold = false) const { return isBold ? m_bold : m_font; }
   int GetLineHeight() const { return m_lineHeight; }
+  /// Of lines, which grow with the text.
+  int GetPenWidth() const;
   /// What a text takes; of several lines, the widest.
   TextSize SizeOf(const std::string& text, bool isBold = false) const;
   /// The sheet as far as it is drawn.

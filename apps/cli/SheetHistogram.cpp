@@ -87,7 +87,8 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
 
 void SheetHistogram::PlaceViewPort() {
   const int line = m_canvas.GetLineHeight();
-  const Margins margins{1, line + line / 3, 1, line + kRulerLength};
+  const int frame = m_canvas.GetPenWidth();
+  const Margins margins{frame, line + line / 3, frame, line + kRulerLength};
   m_picture = WithoutMargins(m_rect, margins);
   m_viewPort.Place(Rect2D(static_cast<float>(m_first), static_cast<float>(-kAir),
                           static_cast<float>(m_last), 0.0F),
@@ -101,7 +102,7 @@ void SheetHistogram::AddCurve(const Histogram& counts) {
   std::vector<float> heights = Heights(counts, m_first, step, columns);
   for (const bool isOutline : {false, true}) {
     auto& curve = AddTo<VGCurveView>(m_viewPort.Inside(), isOutline ? colour::kText : kBars);
-    curve.SetPenThickness(1);
+    curve.SetPenThickness(isOutline ? m_canvas.GetPenWidth() : 1);
     curve.SetDrawMode(isOutline ? CurveDrawMode_Polyline : CurveDrawMode_Bars);
     curve.SetData(static_cast<float>(m_first + 0.5 * step), static_cast<float>(step), columns,
                   heights.data(), CurveStorageMode_Copy);
@@ -109,17 +110,21 @@ void SheetHistogram::AddCurve(const Histogram& counts) {
 }
 
 void SheetHistogram::AddFrame() {
-  const double x = 0.5 * (m_last - m_first) / static_cast<double>(m_picture.right - m_picture.left);
-  const double y = 0.5 * kAir / static_cast<double>(m_picture.bottom - m_picture.top);
-  AddTo<VGRectView>(m_viewPort.Around(), colour::kFrame)
-      .Init(static_cast<float>(m_first - x), static_cast<float>(-kAir - y),
-            static_cast<float>(m_last + x), static_cast<float>(y));
+  const double width = 0.5 * m_canvas.GetPenWidth();
+  const double x =
+      width * (m_last - m_first) / static_cast<double>(m_picture.right - m_picture.left);
+  const double y = width * kAir / static_cast<double>(m_picture.bottom - m_picture.top);
+  auto& frame = AddTo<VGRectView>(m_viewPort.Around(), colour::kFrame);
+  frame.SetPenThickness(m_canvas.GetPenWidth());
+  frame.Init(static_cast<float>(m_first - x), static_cast<float>(-kAir - y),
+             static_cast<float>(m_last + x), static_cast<float>(y));
 }
 
 void SheetHistogram::AddWindow(double low, double high) {
   const auto add = [this](double x1, double y1, double x2, double y2, int style) {
     auto& line = AddTo<VGLineView>(m_viewPort.Inside(), colour::kMeasured);
     line.SetPenStyle(style);
+    line.SetPenThickness(m_canvas.GetPenWidth());
     line.Init(dVect2D(static_cast<float>(x1), static_cast<float>(y1)),
               dVect2D(static_cast<float>(x2), static_cast<float>(y2)), TLine_Segment);
   };
@@ -135,6 +140,7 @@ void SheetHistogram::AddAxis(const study::Study& study) {
   auto& axis = AddTo<VGAxisView>(m_viewPort.Around(), colour::kText);
   axis.Init(dVect2D(static_cast<float>(m_first), static_cast<float>(below)), m_last - m_first,
             TAxis_X, "");
+  axis.SetPenThickness(m_canvas.GetPenWidth());
   axis.SetAxisUnit(&m_unit);
   axis.SetAxisFonts(m_canvas.GetFont(), m_canvas.GetFont());
   axis.SetDisplayFlags(VGAxisDisplay_Line | VGAxisDisplay_Ticks | VGAxisDisplay_Labels |

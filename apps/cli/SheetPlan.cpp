@@ -20,7 +20,6 @@ constexpr std::array<std::pair<const char*, SheetLayout>, 4> kLayouts{
      {"column", SheetLayout::Column},
      {"main", SheetLayout::Main}}};
 
-constexpr int kFrame = 1;              ///< the outline of a picture
 constexpr double kPanelBeside = 0.24;  ///< of the sheet's width, at least
 constexpr double kPanelBelow = 0.2;    ///< of its height, at least
 constexpr double kLargestPanel = 0.36;
@@ -105,7 +104,8 @@ class Planner {
       extent.height = std::max(extent.height, kLeastShare * longest);
     }
     m_plan.hasRulers = furniture.rulers;
-    m_plan.margins = {kFrame, kFrame, kFrame, kFrame};
+    const int frame = request.penWidth;
+    m_plan.margins = {frame, frame, frame, frame};
     if (furniture.titles) {
       m_plan.margins.top = request.lineHeight + request.lineHeight / 3;
     }

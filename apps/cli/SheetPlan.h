@@ -49,6 +49,7 @@ struct SheetRequest {
   /// The views in the order axial, projection, coronal, sagittal.
   std::array<ViewExtent, kViewCount> extents;
   int lineHeight = 0;   ///< of the text
+  int penWidth = 1;     ///< of the pictures' outlines
   int rulerWidth = 0;   ///< what a vertical ruler takes
   int rulerHeight = 0;  ///< what a horizontal one takes
   bool isAnnotated = true;

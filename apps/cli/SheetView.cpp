@@ -52,7 +52,8 @@ SheetView::SheetView(study::Study& study, const SheetCanvas& canvas, const ViewC
       m_frame(OnePixel(study, content.plane).coordinates),
       m_viewPort(canvas),
       m_texts(canvas, m_picture),
-      m_title(canvas, {m_picture.left, place.rect.top, m_picture.right, m_picture.top - 1}) {
+      m_title(canvas, {m_picture.left, place.rect.top, m_picture.right,
+                       m_picture.top - canvas.GetPenWidth()}) {
   const study::Extent x = study::ExtentAlong(study, m_frame.right);
   const study::Extent y = study::ExtentAlong(study, m_frame.down);
   const double halfWidth = 0.5 * static_cast<double>(m_picture.right - m_picture.left);
@@ -115,7 +116,9 @@ void SheetView::AddFrame() {
   auto& frame = AddTo<VGRectView>(m_viewPort.Around(), m_content.colour);
   const double width = static_cast<double>(m_picture.right - m_picture.left);
   const double height = static_cast<double>(m_picture.bottom - m_picture.top);
-  frame.Init(GraphicAt(-0.5, -0.5), GraphicAt(width + 0.5, height + 0.5));
+  const double aside = 0.5 * m_canvas.GetPenWidth();
+  frame.SetPenThickness(m_canvas.GetPenWidth());
+  frame.Init(GraphicAt(-aside, -aside), GraphicAt(width + aside, height + aside));
 }
 
 void SheetView::Annotate(const study::Study& study) {
@@ -130,6 +133,7 @@ void SheetView::Annotate(const study::Study& study) {
 void SheetView::AddCursor() {
   auto& cursor = AddTo<VGCrossCursorView>(m_viewPort.Inside(), colour::kStrong);
   cursor.Set(m_frame.X(m_content.cursor), m_frame.Y(m_content.cursor));
+  cursor.SetPenThickness(m_canvas.GetPenWidth());
   cursor.SetCursorColors(static_cast<long>(m_content.acrossColour),
                          static_cast<long>(m_content.downColour));
 }
@@ -148,9 +152,11 @@ void SheetView::AddRuler(bool isHorizontal, UnitTrafo& unit) {
   auto& ruler = AddTo<VGAxisView>(m_viewPort.Around(), colour::kText);
   const double width = static_cast<double>(m_picture.right - m_picture.left);
   const double height = static_cast<double>(m_picture.bottom - m_picture.top);
+  const double aside = m_canvas.GetPenWidth() + 0.5;
   const double length = (isHorizontal ? width : height) * m_place.mmPerPixel;
-  ruler.Init(isHorizontal ? GraphicAt(0, height + 1.5) : GraphicAt(-1.5, 0), length,
+  ruler.Init(isHorizontal ? GraphicAt(0, height + aside) : GraphicAt(-aside, 0), length,
              isHorizontal ? TAxis_X : TAxis_Y, "");
+  ruler.SetPenThickness(m_canvas.GetPenWidth());
   ruler.SetAxisUnit(&unit);
   ruler.SetAxisFonts(m_canvas.GetFont(), m_canvas.GetFont());
   ruler.SetDisplayFlags(VGAxisDisplay_Ticks | VGAxisDisplay_Labels | VGAxisDisplay_UnitText);

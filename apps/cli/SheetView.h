@@ -72,7 +72,6 @@ class SheetView {
   void AddRuler(bool isHorizontal, UnitTrafo& unit);
   void AddLetters();
   void AddTitle(const study::Study& study);
-  int PenWidth() const;
   tagRECT AddLine(const PlaneLine& measured);
   tagRECT AddRegion(const PlaneRect& region);
   double Brightness(const tagRECT& rect) const;

@@ -36,18 +36,12 @@ void SheetView::Show(const Measured& measured) {
   }
 }
 
-/// Lines grow with the text.
-int SheetView::PenWidth() const {
-  constexpr int kTextPerPixel = 18;
-  return std::max(1, m_canvas.GetLineHeight() / kTextPerPixel);
-}
-
 tagRECT SheetView::AddLine(const PlaneLine& measured) {
   const auto& [start, end] = measured;
   auto& line = AddTo<VGLineView>(m_viewPort.Inside(), colour::kMeasured);
   line.Init(dVect2D(static_cast<float>(start.x), static_cast<float>(start.y)),
             dVect2D(static_cast<float>(end.x), static_cast<float>(end.y)), TLine_Segment);
-  line.SetPenThickness(PenWidth());
+  line.SetPenThickness(m_canvas.GetPenWidth());
   line.Select(true);
   const tagRECT place = PixelsOf({std::min(start.x, end.x), std::min(start.y, end.y),
                                   std::max(start.x, end.x), std::max(start.y, end.y)});
@@ -57,7 +51,7 @@ tagRECT SheetView::AddLine(const PlaneLine& measured) {
 
 tagRECT SheetView::AddRegion(const PlaneRect& region) {
   auto& rect = AddTo<VGRectView>(m_viewPort.Inside(), colour::kMeasured);
-  rect.SetPenThickness(PenWidth());
+  rect.SetPenThickness(m_canvas.GetPenWidth());
   rect.Init(static_cast<float>(region.left), static_cast<float>(region.top),
             static_cast<float>(region.right), static_cast<float>(region.bottom));
   m_texts.Take(PixelsOf(region));
