@@ -25,13 +25,16 @@ constexpr double kPanelBelow = 0.2;    ///< of its height, at least
 constexpr double kLargestPanel = 0.36;
 /// Pictures get so much more than what they show needs where there is room.
 constexpr double kMostSlack = 0.4;
-constexpr double kSmallMain =
-    0.36;  ///< of the block: the small views beside the large one, at most
+/// What the small views beside a large one take of their block at most.
+constexpr double kSmallMain = 0.36;
 /// Views are made as if they were this much of the longest one: there must be room for text.
 constexpr double kLeastShare = 0.3;
 /// What a picture must be for the annotations to stay, in lines of text.
 constexpr int kLeastWidth = 9;
 constexpr int kLeastHeight = 6;
+/// The same for the panel.
+constexpr int kLeastPanelWidth = 12;
+constexpr int kLeastPanelHeight = 8;
 
 struct Furniture {
   bool header, panel, rulers, titles;
@@ -116,7 +119,7 @@ class Planner {
     }
   }
 
-  /// False when the pictures become too small.
+  /// False when the pictures or the panel become too small.
   bool Plan() {
     tagRECT block{m_gap, m_gap, m_request.width - m_gap, m_request.height - m_gap};
     if (m_furniture.header) {
@@ -176,8 +179,8 @@ class Planner {
     tagRECT large = block;
     large.right -= std::min(wanted, most) + m_gap;
     const tagRECT used = Place(m_grid, large);
-    const tagRECT small_{large.right + m_gap, block.top, block.right, block.bottom};
-    Place(kBesideMain, small_);
+    const tagRECT others{large.right + m_gap, block.top, block.right, block.bottom};
+    Place(kBesideMain, others);
     m_used = {block.left, block.top, block.right - (large.right - used.right),
               std::max(used.bottom, block.top)};
     if (wanted < most) {
@@ -244,6 +247,10 @@ class Planner {
 
   bool IsLargeEnough() const {
     const int line = m_request.lineHeight;
+    if (m_furniture.panel && (Width(m_plan.panel) < kLeastPanelWidth * line ||
+                              Height(m_plan.panel) < kLeastPanelHeight * line)) {
+      return false;
+    }
     return std::all_of(m_plan.views.begin(), m_plan.views.end(), [&](const tagRECT& view) {
       return Width(view) - HorizontalMargins() >= kLeastWidth * line &&
              Height(view) - VerticalMargins() >= kLeastHeight * line;

@@ -6,7 +6,7 @@
 namespace cli {
 namespace {
 
-constexpr int kGap = 2;
+constexpr int kLinePerGap = 3;  ///< to the left and right of texts
 
 }  // namespace
 
@@ -19,10 +19,11 @@ TextLayer::TextLayer(const SheetCanvas& canvas, const tagRECT& bounds)
 }
 
 bool TextLayer::IsFree(const tagRECT& box) const {
+  const int gap = m_canvas.GetLineHeight() / kLinePerGap;
   return box.left >= m_bounds.left && box.right <= m_bounds.right && box.top >= m_bounds.top &&
          box.bottom <= m_bounds.bottom &&
-         std::none_of(m_taken.begin(), m_taken.end(), [&box](const tagRECT& taken) {
-           return box.left < taken.right + kGap && taken.left < box.right + kGap &&
+         std::none_of(m_taken.begin(), m_taken.end(), [&box, gap](const tagRECT& taken) {
+           return box.left < taken.right + gap && taken.left < box.right + gap &&
                   box.top < taken.bottom && taken.top < box.bottom;
          });
 }

@@ -70,7 +70,7 @@ void ExpectBox(const ColourPicture& sheet, const Frame& frame, double mmPerPixel
 
 TEST_F(RenderPictures, EveryLayoutShowsFourPicturesApartFromEachOther) {
   for (const char* layout : kLayouts) {
-    for (const char* size : {"160x120", "400x300", "800x600", "640x900"}) {
+    for (const char* size : {"160x120", "400x300", "800x600", "640x900", "1500x160", "170x1500"}) {
       SCOPED_TRACE(std::string(layout) + " " + size);
       const std::vector<Frame> frames =
           All(FindFrames(BoxSheet({"--layout", layout, "--size", size})));
@@ -128,12 +128,12 @@ TEST_F(RenderPictures, TheMainPictureIsTheLargestAndUndistorted) {
       BoxSheet({"--no-annotations", "--layout", "main", "--size", "900x700"});
   const Frames frames = FindFrames(sheet);
   const double large = 60.0 / BrightBox(sheet, frames.axial).Width();
-  const double small_ = 60.0 / BrightBox(sheet, frames.coronal).Width();
-  EXPECT_LT(1.5 * large, small_);
+  const double others = 60.0 / BrightBox(sheet, frames.coronal).Width();
+  EXPECT_LT(1.5 * large, others);
   ExpectBox(sheet, frames.axial, large, -30, -30, 30, 20);
-  ExpectBox(sheet, frames.coronal, small_, -30, -15, 30, 30);
-  ExpectBox(sheet, frames.sagittal, small_, -30, -15, 20, 30);
-  ExpectBox(sheet, frames.projection, small_, -30, -15, 30, 30);
+  ExpectBox(sheet, frames.coronal, others, -30, -15, 30, 30);
+  ExpectBox(sheet, frames.sagittal, others, -30, -15, 20, 30);
+  ExpectBox(sheet, frames.projection, others, -30, -15, 30, 30);
 }
 
 TEST_F(RenderPictures, PicturesReachToTheEdgesOfTheVolume) {
