@@ -128,7 +128,8 @@ INSTANTIATE_TEST_SUITE_P(
     Options, RenderRefusal,
     testing::Values(
         RefusalCase{"NoOutput", {}, "no output is named (-o SHEET.png or -o SHEET.bmp)"},
-        RefusalCase{"Extension", {"-o", "a.gif"}, "-o: the name 'a.gif' does not end in .png or .bmp"},
+        RefusalCase{
+            "Extension", {"-o", "a.gif"}, "-o: the name 'a.gif' does not end in .png or .bmp"},
         RefusalCase{"Layout",
                     {"-o", "a.png", "--layout", "3x3"},
                     "--layout: '3x3' is not one of 2x2, row, column, main"},
