@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# Cuts a volume along four planes and saves the pictures.
+# Cuts a volume along four planes, draws a sheet of it, and saves the pictures.
 #
 #   scripts/demo.sh             the built-in phantom
 #   scripts/demo.sh FOLDER      a folder with a DICOM series
@@ -33,8 +33,11 @@ for plane in axial coronal sagittal oblique; do
   "$tool" mpr "$input" --plane "$plane" --window "$window" -o "$output/$plane.png"
 done
 
+step 'The sheet'
+"$tool" render "$input" --window "$window" -o "$output/sheet.png"
+
 step 'Done. The pictures:'
-for plane in axial coronal sagittal oblique; do
-  [ -s "$output/$plane.png" ] || fail "$output/$plane.png was not written"
-  printf '  %s\n' "$output/$plane.png"
+for picture in axial coronal sagittal oblique sheet; do
+  [ -s "$output/$picture.png" ] || fail "$output/$picture.png was not written"
+  printf '  %s\n' "$output/$picture.png"
 done

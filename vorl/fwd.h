@@ -75,6 +75,7 @@ class TrafoSRT2D;
 class TrafoST2D;
 class Translate2D;
 class UnitTrafo;
+class VGAnchorView;
 class VGAxis;
 class VGAxisView;
 class VGBitmapView;

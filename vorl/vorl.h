@@ -38,6 +38,7 @@
 #include <vorl/GUI/Rect2D.h>
 #include <vorl/GUI/Trafo1D.h>
 #include <vorl/GUI/Trafo2D.h>
+#include <vorl/GUI/VGAnchorView.h>
 #include <vorl/GUI/VGAxis.h>
 #include <vorl/GUI/VGBitmapView.h>
 #include <vorl/GUI/VGCrossCursorView.h>

@@ -16,7 +16,8 @@ namespace {
 
 constexpr char kDescription[] =
     "vorl looks at image volumes: it tells what is in a DICOM series, cuts planes out of\n"
-    "it, projects it, lists its brightest voxels, and converts it into study files.\n\n"
+    "it, projects it, draws sheets for reports, lists its brightest voxels, and converts it\n"
+    "into study files.\n\n"
     "An INPUT is a folder with a DICOM series, the files of one, or a study file (.bdf);\n"
     "--phantom stands for a built-in torso.";
 constexpr char kFooter[] =
@@ -26,6 +27,7 @@ constexpr char kFooter[] =
     "  vorl mpr --phantom --plane oblique -o oblique.png\n"
     "  vorl mip scans/ --turntable 36 -o film/turn.png\n"
     "  vorl project scans/ -o view.png\n"
+    "  vorl render scans/ -o sheet.png\n"
     "  vorl select scans/ --limit 2% -o bones.bdf --draw bones.png\n"
     "  vorl convert scans/ study.bdf\n\n"
     "'vorl COMMAND --help' tells more. The exit code is 0 after success, 1 when something\n"
@@ -47,6 +49,7 @@ Commands DeclareCommands(CLI::App& app) {
   commands.push_back(MakeMprCommand(app));
   commands.push_back(MakeMipCommand(app));
   commands.push_back(MakeProjectCommand(app));
+  commands.push_back(MakeRenderCommand(app));
   commands.push_back(MakeSelectCommand(app));
   commands.push_back(MakeConvertCommand(app));
   commands.push_back(MakePhantomCommand(app));

@@ -74,6 +74,7 @@ std::unique_ptr<Command> MakeInfoCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMprCommand(CLI::App& application);
 std::unique_ptr<Command> MakeMipCommand(CLI::App& application);
 std::unique_ptr<Command> MakeProjectCommand(CLI::App& application);
+std::unique_ptr<Command> MakeRenderCommand(CLI::App& application);
 std::unique_ptr<Command> MakeSelectCommand(CLI::App& application);
 std::unique_ptr<Command> MakeConvertCommand(CLI::App& application);
 std::unique_ptr<Command> MakePhantomCommand(CLI::App& application);

@@ -40,6 +40,22 @@ void PlaceCut(study::Study& cut, const dCoordSys3D& plane) {
                      study::ToVec3(plane.axisY), study::ToVec3(plane.axisZ));
 }
 
+study::PlaneRequest VoxelPlane(const study::Study& study, study::Plane plane,
+                               const study::Vec3& centre) {
+  study::PlaneRequest request;
+  request.plane = plane;
+  request.width = request.height = 1;
+  const dCoordSys3D place = MakePlane(study, request).coordinates;
+  const auto step = [&study](const dVect3D& axis) {
+    return 1 / VoxelsPerMillimetre(study, study::Normalised(study::ToVec3(axis)));
+  };
+  request.centre = centre;
+  request.width = request.height = 0;
+  request.spacing = step(place.axisX);
+  request.spacingDown = step(place.axisY);
+  return request;
+}
+
 double VoxelsPerMillimetre(const study::Study& study, const study::Vec3& direction) {
   const study::Vec3 step =
       study::VoxelFromWorld(study, direction) - study::VoxelFromWorld(study, {});

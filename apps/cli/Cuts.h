@@ -23,6 +23,11 @@ std::unique_ptr<study::Study> MakeCut(const study::Study& study, int width, int 
 /// Places a cut where its plane lies, whose origin is the centre of the first pixel.
 void PlaceCut(study::Study& cut, const dCoordSys3D& plane);
 
+/// The whole plane through a point with the voxels that it meets as pixels: as far apart as they
+/// are in the directions to the right and down.
+study::PlaneRequest VoxelPlane(const study::Study& study, study::Plane plane,
+                               const study::Vec3& centre);
+
 /// How many voxels a millimetre in the direction of a unit vector crosses, counted along the
 /// volume's axis on which it crosses most.
 double VoxelsPerMillimetre(const study::Study& study, const study::Vec3& direction);

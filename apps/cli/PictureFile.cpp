@@ -5,9 +5,10 @@
 
 namespace cli {
 
-void AddPictureOption(CLI::App& command, std::string& target, const std::string& group) {
+void AddPictureOption(CLI::App& command, std::string& target, const std::string& group,
+                      const std::string& kind) {
   AddText(command, "-o,--output", target, "FILE",
-          "The picture, by its extension .png or .bmp, 8-bit grey\n(a device or pipe gets PNG)",
+          "The picture, by its extension .png or .bmp, " + kind + "\n(a device or pipe gets PNG)",
           group);
 }
 

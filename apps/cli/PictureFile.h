@@ -13,8 +13,9 @@
 
 namespace cli {
 
-/// Declares -o, the picture to write; its name is kept in `target`.
-void AddPictureOption(CLI::App& command, std::string& target, const std::string& group);
+/// Declares -o, the picture to write; its name is kept in `target`. `kind` tells its pixels.
+void AddPictureOption(CLI::App& command, std::string& target, const std::string& group,
+                      const std::string& kind = "8-bit grey");
 
 /// Throws `UsageError` unless the name ends in .png or .bmp, or is that of a device.
 void CheckPictureName(const std::string& option, const std::string& path);

@@ -146,6 +146,13 @@ std::string PositionText(double millimetres) {
   return NumberText(std::round(millimetres * 1e4) / 1e4);
 }
 
+std::string FixedText(double value, int decimals) {
+  char text[400];
+  std::snprintf(text, sizeof text, "%.*f", decimals, value);
+  const bool isZero = std::string(text).find_first_not_of("-0.") == std::string::npos;
+  return isZero && text[0] == '-' ? text + 1 : text;
+}
+
 std::string LengthText(double value) {
   const auto single = static_cast<float>(value);
   char text[64];

@@ -47,6 +47,9 @@ std::string NumberText(double value);
 /// A position in millimetres to the tenth of a micrometre, without trailing zeros.
 std::string PositionText(double millimetres);
 
+/// A number with so many decimals, and never a negative zero.
+std::string FixedText(double value, int decimals);
+
 /// A length that was kept in single precision: "0.7" rather than "0.699999988", but all nine
 /// digits of 0.451171875, which single precision holds exactly.
 std::string LengthText(double value);

@@ -1,4 +1,5 @@
 #include <cli/Command.h>
+#include <cli/Histogram.h>
 #include <cli/Values.h>
 #include <cli/Windows.h>
 
@@ -25,7 +26,8 @@ constexpr std::array<Preset, 7> kPresets{{{"bone", {500, 2000}},
                                           {"liver", {60, 160}},
                                           {"angio", {300, 600}}}};
 
-constexpr double kStoredValues = 65536;
+/// How many values a sample can have.
+constexpr auto kValues = static_cast<double>(kStoredValues);
 constexpr double kAutoTail = 0.005;
 constexpr double kProjectionTail = 1e-4;
 constexpr double kProjectionHeadroom = 1.1;
@@ -34,18 +36,6 @@ constexpr double kProjectionHeadroom = 1.1;
 /// below, stays above 0. Samples that saturate at 0 are below it then, as they should be. (A window
 /// that lies too low is moved to 0, and what saturates at 65535 is above it.)
 constexpr double kHighCentre = 40000;
-
-using Histogram = std::vector<std::uint64_t>;
-
-Histogram HistogramOf(const study::Study& study) {
-  Histogram counts(static_cast<std::size_t>(kStoredValues));
-  for (const dSlice& slice : study.volume.GetSliceList()) {
-    for (const std::uint16_t sample : study::SamplesOf(slice)) {
-      ++counts[sample];
-    }
-  }
-  return counts;
-}
 
 double VoxelCount(const study::Study& study) {
   return 1.0 * study.volume.GetSizeX() * study.volume.GetSizeY() * study.volume.GetSizeZ();
@@ -107,7 +97,7 @@ RealWindow AutoWindow(study::Study& study) {
   const double tail = kAutoTail * VoxelCount(study);
   const auto lowest = static_cast<double>(PassTail(counts.begin(), counts.end(), tail));
   const double highest =
-      kStoredValues - 1 - static_cast<double>(PassTail(counts.rbegin(), counts.rend(), tail));
+      kValues - 1 - static_cast<double>(PassTail(counts.rbegin(), counts.rend(), tail));
   const double width = std::max(highest - lowest, 2.0);
   return {study.RealValue(0.5 * (lowest + highest)), width * study.scale};
 }
@@ -116,7 +106,7 @@ RealWindow ProjectionWindow(study::Study& study) {
   const Histogram counts = HistogramOf(study);
   const double voxels = VoxelCount(study);
   const auto fromTop = [&](double tail) {
-    return kStoredValues - 1 -
+    return kValues - 1 -
            static_cast<double>(PassTail(counts.rbegin(), counts.rend(), tail * voxels));
   };
   const auto darkest =
@@ -139,7 +129,7 @@ std::optional<RealWindow> DrawnWindow(const study::Study& picture) {
   const auto lowest =
       static_cast<double>(PassTail(counts.begin(), counts.end(), kAutoTail * drawn));
   const double highest =
-      kStoredValues - 1 -
+      kValues - 1 -
       static_cast<double>(PassTail(counts.rbegin(), counts.rend(), kAutoTail * drawn));
   // The darkest third of the levels is left to the black around.
   const double width = std::max(1.5 * (highest - lowest), 2.0);
@@ -165,14 +155,13 @@ RealWindow ResolveWindow(const WindowChoice& choice, study::Study& study) {
 TableWindow PlaceWindow(const RealWindow& window, const study::Study& study) {
   const double width = window.width / study.scale;
   TableWindow placed;
-  placed.factor = std::min(1.0, kStoredValues / width);
+  placed.factor = std::min(1.0, kValues / width);
   const double centre = study.StoredValue(window.centre) * placed.factor;
-  const double tableCentre = centre < 0 ? 0 : centre > kStoredValues ? kHighCentre : centre;
+  const double tableCentre = centre < 0 ? 0 : centre > kValues ? kHighCentre : centre;
   placed.centre = static_cast<int>(std::lround(tableCentre));
   // A centre that fits is rounded, not compensated: samples are whole numbers as well.
   placed.shift = tableCentre == centre ? 0 : tableCentre - centre;
-  placed.width =
-      static_cast<int>(std::lround(std::clamp(width * placed.factor, 2.0, kStoredValues)));
+  placed.width = static_cast<int>(std::lround(std::clamp(width * placed.factor, 2.0, kValues)));
   return placed;
 }
 

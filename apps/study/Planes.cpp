@@ -67,10 +67,12 @@ void CheckRequest(const PlaneRequest& request) {
           "the angles of the plane are not finite");
   Require(!request.centre || (IsFinite(*request.centre) && Length(*request.centre) <= kLongestMm),
           "the centre of the plane is not within a kilometre");
-  Require(IsLength(request.spacing) && IsLength(request.thickness),
+  Require(IsLength(request.spacing) && IsLength(request.spacingDown) && IsLength(request.thickness),
           "the spacing and thickness of the plane must be positive numbers of millimetres");
-  Require(request.spacing == 0 || request.spacing >= kSmallestSpacingMm,
-          "the spacing of the plane is less than 0.0001 mm");
+  for (const double spacing : {request.spacing, request.spacingDown}) {
+    Require(spacing == 0 || spacing >= kSmallestSpacingMm,
+            "the spacing of the plane is less than 0.0001 mm");
+  }
   Require(request.width >= 0 && request.height >= 0, "the size of the plane is negative");
 }
 
@@ -100,11 +102,11 @@ Row PlaceRow(const Study& study, const Vec3& direction, int wanted, double centr
 }
 
 /// A thin plane has no thickness of its own, but its coordinates must be invertible.
-double AxisLength(double thickness, double spacing) {
+double AxisLength(double thickness, double spacing, double spacingDown) {
   if (thickness > 0) {
     return thickness;
   }
-  return std::max(spacing, 1e-5 / (spacing * spacing));
+  return std::max(spacing, 1e-5 / (spacing * spacingDown));
 }
 
 /// How much the plane's first sample lacks to whole voxel coordinates that it misses only by the
@@ -130,18 +132,19 @@ PlaneGeometry MakePlane(const Study& study, const PlaneRequest& request) {
   const Vec3 centre = request.centre.value_or(MiddleVoxel(study));
   PlaneGeometry plane;
   plane.spacing = request.spacing > 0 ? request.spacing : SmallestSpacing(study);
+  const double spacingDown = request.spacingDown > 0 ? request.spacingDown : plane.spacing;
   const Row across =
       PlaceRow(study, frame.right, request.width, Dot(centre, frame.right), plane.spacing);
   const Row along =
-      PlaceRow(study, frame.down, request.height, Dot(centre, frame.down), plane.spacing);
+      PlaceRow(study, frame.down, request.height, Dot(centre, frame.down), spacingDown);
   plane.width = across.count;
   plane.height = along.count;
 
   const Vec3 origin = frame.right * across.first + frame.down * along.first +
                       frame.normal * Dot(centre, frame.normal);
-  const double depth = AxisLength(request.thickness, plane.spacing);
+  const double depth = AxisLength(request.thickness, plane.spacing, spacingDown);
   plane.coordinates.Set(ToVect(origin), ToVect(frame.right * plane.spacing),
-                        ToVect(frame.down * plane.spacing), ToVect(frame.normal * depth));
+                        ToVect(frame.down * spacingDown), ToVect(frame.normal * depth));
   Require(PlacementProblem(plane.coordinates).empty(), "the plane's pixels are too small");
   return plane;
 }

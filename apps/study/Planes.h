@@ -37,6 +37,8 @@ struct PlaneRequest {
   int height = 0;
   /// From pixel to pixel, the same in both directions; 0: the smallest voxel spacing.
   double spacing = 0;
+  /// From row to row, where that is to be another distance; 0: as from pixel to pixel.
+  double spacingDown = 0;
   /// Of the slab; 0: a thin plane.
   double thickness = 0;
 };
@@ -45,13 +47,14 @@ struct PlaneRequest {
 ///
 /// The sampling operators take pixel (x, y) at the point (x, y, 0) of the slice's coordinates, so
 /// `coordinates.origin` is the world position of the centre of pixel (0, 0), unlike a volume's
-/// origin, which is the outer corner of its first voxel. axisX points right and axisY down, each as
-/// long as the spacing; axisZ is perpendicular to both and as long as the slab is thick.
+/// origin, which is the outer corner of its first voxel. axisX points right and axisY down, as long
+/// as the distances of pixels and rows; axisZ is perpendicular to both and as long as the slab is
+/// thick.
 struct PlaneGeometry {
   dCoordSys3D coordinates;
   int width = 0;
   int height = 0;
-  double spacing = 1;
+  double spacing = 1;  ///< from pixel to pixel
 };
 
 /// Places a plane. Throws `Error` when the numbers of the request make no sense, or when the

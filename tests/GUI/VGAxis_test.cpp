@@ -233,12 +233,23 @@ TEST(VGAxisView, FormatMapsTheValue) {
   EXPECT_EQ(FormatOf(vertical, 0.125), "%2.0f");  // 1.25
 }
 
+// A tenth has no exact counterpart in single precision: there it is a little larger.
+TEST(VGAxisView, FormatMapsTheValueInDoublePrecision) {
+  Scale2D scale(0.4, 0.4, 0, 0);
+  VGAxisView view = AxisView(10, 100);
+  EXPECT_EQ(FormatOf(view, 0.1), "%3.1f");
+  view.SetTransformation(&scale);
+  EXPECT_EQ(FormatOf(view, 0.25), "%3.1f");
+}
+
 TEST(VGAxisView, FormatFollowsTheUnit) {
   UnitTrafo unit;
   unit.SetUnitTrafo(0, 0.001, 0.0);
   VGAxisView view = AxisView(1000, 5000);
   view.SetAxisUnit(&unit);
   EXPECT_EQ(FormatOf(view, 50.0), "%2.2f");
+  unit.SetUnitTrafo(0, 0.001, 3.0);
+  EXPECT_EQ(FormatOf(view, 50.0), "%1.1f") << "3.05";
   unit.SetIntegerUnit(0, true);
   EXPECT_EQ(FormatOf(view, 50.0), "%0.0f");
 }

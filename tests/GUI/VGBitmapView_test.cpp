@@ -313,6 +313,12 @@ TEST(VGBitmapView, ModificationWithoutAHandleChangesNothing) {
   EXPECT_TRUE(view.OnModify(p));
   EXPECT_EQ(Corners(view.BaseRect()), "10 20 - 50 80");
   EXPECT_EQ(StateAt(view, 10, 20), 4);
+  view.ResetViewState(VGViewState_Visible);
+  EXPECT_EQ(StateAt(view, 10, 20), 0);
+  EXPECT_TRUE(view.OnModify(p));
+  EXPECT_EQ(Corners(view.BaseRect()), "10 20 - 50 80") << "nor while it is not seen";
+  view.SetViewState(VGViewState_Visible);
+  EXPECT_EQ(StateAt(view, 10, 20), 4);
   EXPECT_TRUE(view.OnEndModify(p));
   EXPECT_TRUE(view.OnModify(p));
   EXPECT_EQ(Corners(view.BaseRect()), "10 20 - 50 80");

@@ -164,6 +164,23 @@ TEST(VGCurveViewDraw, RasterOperationIsUsedAndRestored) {
   }
 }
 
+TEST(VGCurveViewDraw, GapsOfABrokenLineAreNotFilled) {
+  VGCurveView view = CurveView({9, 9, 9, 9, 9, 9});
+  view.SetPenStyle(PS_DOT);
+  Canvas canvas(32, 32);
+  canvas.Fill(0);
+  SetBkMode(canvas, OPAQUE);
+  SetBkColor(canvas, 0xFFFFFF);
+  view.DrawGraphic(canvas);
+  const Pixels lit = Lit(canvas);
+  EXPECT_GT(lit.size(), 5U);
+  EXPECT_LT(lit.size(), 20U);
+  for (const auto& [x, y] : lit) {
+    EXPECT_EQ(canvas.At(x, y), 0x0000FFU);
+  }
+  EXPECT_EQ(SetBkMode(canvas, TRANSPARENT), OPAQUE);
+}
+
 TEST(VGCurveViewDraw, HugeCoordinatesAreDrawnWithoutHarm) {
   for (const CurveDrawMode mode :
        {CurveDrawMode_Polyline, CurveDrawMode_Bars, CurveDrawMode_Dots}) {

@@ -131,6 +131,14 @@ TEST(VGCurve, XValuesAreTruncatedToIndices) {
   }
 }
 
+TEST(VGCurve, IndicesAreComputedInSinglePrecision) {
+  float values[] = {0, 1, 2, 3, 4, 5, 6, 7};
+  VGCurve curve;
+  curve.SetData(0, 0.1F, 8, values, CurveStorageMode_Copy);
+  EXPECT_EQ(curve.GetValue(0.7F), 7.0F) << "the seventh tenth is no less than seven tenths";
+  EXPECT_EQ(curve.GetValue(0.7), 7.0F);
+}
+
 TEST(VGCurve, NegativeStepsCountDown) {
   float values[] = {1, 2, 3};
   VGCurve curve;

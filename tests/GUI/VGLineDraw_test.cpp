@@ -71,6 +71,73 @@ TEST(VGLineViewDraw, LineOutsideTheClipRegionIsNotDrawn) {
   EXPECT_EQ(Lit(canvas), Pixels{});
 }
 
+// In a picture that is shown very small, a line may be a fraction of a pixel long; single precision
+// does not know where it would end.
+TEST(VGLineViewDraw, InfiniteLineKeepsItsSlopeWhereverItsPositionIs) {
+  VGLine line;
+  line.SetPos(dVect2D(16 - 3e6F, 16 - 1e6F));
+  line.SetVector(dVect2D(0.3F, 0.1F));
+  VGLineView distant(line);
+  distant.SetPenColor(0x0000FF);
+  Canvas canvas(32, 32);
+  canvas.Fill(0);
+  distant.DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas).size(), 32U);
+  EXPECT_TRUE(canvas.At(16, 15) != 0 || canvas.At(16, 16) != 0 || canvas.At(16, 17) != 0);
+  line.SetPos(dVect2D(16, 16));
+  line.SetVector(dVect2D(1e-7F, -1e-7F));
+  VGLineView tiny(line);
+  tiny.SetPenColor(0x0000FF);
+  canvas.Fill(0);
+  tiny.DrawGraphic(canvas);
+  EXPECT_EQ(canvas.At(2, 30), 0x0000FFU);
+  EXPECT_EQ(canvas.At(30, 2), 0x0000FFU);
+}
+
+TEST(VGLineViewDraw, PenIsThatOfTheView) {
+  Canvas canvas(32, 32);
+  canvas.Fill(0);
+  VGLineView view = LineView(6, 9, 26, 9, TLine_Segment);
+  view.SetPenThickness(3);
+  view.Enable(32);
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(canvas.At(10, 8), 0x0000FFU);
+  EXPECT_EQ(canvas.At(10, 10), 0x0000FFU);
+  EXPECT_EQ(canvas.At(10, 7), 0U);
+  for (const auto& [x, y] : DotOf(2 * 3 + 3, 16, 9)) {
+    EXPECT_NE(canvas.At(x, y), 0U) << x << " " << y;
+  }
+  canvas.Fill(0);
+  view.Disable(32);
+  view.SetPenThickness(1);
+  view.SetPenStyle(PS_NULL);
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas), Pixels{});
+}
+
+TEST(VGLineViewDraw, NumbersWithoutAPlaceDoNoHarm) {
+  Canvas canvas(32, 32);
+  for (const float x : {1e30F, -3e38F, INFINITY, NAN}) {
+    for (const TLine type : {TLine_Infinite, TLine_Segment}) {
+      VGLineView view = LineView(x, 5, -x, NAN, type);
+      view.Enable(VGOperation_All);
+      view.Select(true);
+      view.VGObjectView::Draw(canvas);
+      dVect2D p(x, x);
+      EXPECT_TRUE(view.OnBeginRotate(p));
+      EXPECT_TRUE(view.OnRotate(p));
+      EXPECT_TRUE(view.OnEndRotate(p));
+    }
+  }
+  canvas.Fill(0);
+  VGLineView(VGLine()).DrawGraphic(nullptr);
+  VGLine line;
+  line.SetVector(dVect2D(0, 0));
+  VGLineView(line).DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas), Pixels{}) << "no direction, no line";
+  EXPECT_EQ(RopOf(canvas), R2_COPYPEN);
+}
+
 TEST(VGLineViewDraw, RotationHandleIsADot) {
   const Pixels dot = DotOf(2 * 1 + 3, 16, 9);
   Canvas segment(32, 32);

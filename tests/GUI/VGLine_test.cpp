@@ -214,6 +214,10 @@ TEST(VGLineView, ModifyingWithoutAHandleChangesNothing) {
   EXPECT_EQ(Ends(view), "10 10 - 50 10");
   dVect2D start(10, 10);
   view.OnBeginModify(start);
+  view.OnBeginModify(beside);
+  EXPECT_TRUE(view.OnModify(away));
+  EXPECT_EQ(Ends(view), "10 10 - 50 10") << "each drag chooses anew";
+  view.OnBeginModify(start);
   EXPECT_TRUE(view.OnEndModify(start));
   EXPECT_TRUE(view.OnModify(away));
   EXPECT_EQ(Ends(view), "10 10 - 50 10") << "the end of the drag let go of it";
@@ -310,7 +314,10 @@ TEST(VGLineView, CreationNeedsItsBitAndAClick) {
   EXPECT_FALSE(view.OnCreate(MouseEvent_Move, MK_LBUTTON, p));
   EXPECT_FALSE(view.OnCreate(MouseEvent_ButtonUp, MK_LBUTTON, p));
   EXPECT_EQ(view.GetType(), TLine_Infinite);
+  view.Enable(kRotate);
   EXPECT_TRUE(view.OnCreate(MouseEvent_ButtonDown, 0, p));
+  EXPECT_TRUE(view.IsEnabled(1 | 4)) << "its end may be pulled";
+  EXPECT_FALSE(view.IsEnabled(kRotate));
 }
 
 }  // namespace

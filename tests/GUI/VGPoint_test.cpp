@@ -9,11 +9,8 @@ namespace {
 
 using gui_testing::At;
 using gui_testing::BoxOf;
-using gui_testing::Hand;
-using gui_testing::IsHit;
 using gui_testing::Lit;
 using gui_testing::RopOf;
-using gui_testing::StateAt;
 using Pixels = std::set<std::pair<int, int>>;
 
 VGPointView PointView(float x, float y) {
@@ -61,67 +58,6 @@ TEST(VGPointView, IsAPointInViewCoordinates) {
   EXPECT_EQ(At(copy.GetViewData()), "10 10");
 }
 
-TEST(VGPointView, IsHitAndGrabbedAround) {
-  VGPointView view = PointView(10, 10);
-  EXPECT_TRUE(IsHit(view, 13, 14, 5));
-  EXPECT_FALSE(IsHit(view, 14, 14, 5));
-  EXPECT_EQ(StateAt(view, 10, 14), 8);
-  EXPECT_EQ(StateAt(view, 10, 15), 0);
-  view.Enable(VGOperation_All);
-  EXPECT_EQ(StateAt(view, 10, 10), 8) << "for nothing but a move";
-  view.SetSelectionDistances(9, 1);
-  EXPECT_EQ(StateAt(view, 10, 12), 0);
-  view.Disable(2);
-  EXPECT_EQ(StateAt(view, 10, 10), 0);
-  view.Enable(2);
-  view.ResetViewState(2);
-  EXPECT_EQ(StateAt(view, 10, 10), 0);
-}
-
-TEST(VGPointView, DragPutsItUnderTheMouse) {
-  Scale2D scale(2, 2, 0, 0);
-  VGPointView view = PointView(10, 10);
-  Hand hand(view);
-  hand.handler.SetTransformation(&scale);
-  EXPECT_TRUE(hand.Down(22, 20));
-  EXPECT_EQ(view.GetROPMode(), 7);
-  EXPECT_EQ(view.GetOpState(), 8);
-  EXPECT_EQ(At(view), "10 10");
-  EXPECT_TRUE(hand.Move(32, 40));
-  EXPECT_EQ(At(view), "16 20");
-  EXPECT_TRUE(hand.Up(90, 90));
-  EXPECT_EQ(At(view), "16 20");
-  EXPECT_EQ(view.GetROPMode(), 13);
-  EXPECT_EQ(view.GetOpState(), 0);
-}
-
-TEST(VGPointView, ClickCreatesItAtOnce) {
-  Scale2D scale(2, 2, 0, 0);
-  VGPointView view;
-  view.SetTransformation(&scale);
-  view.Enable(VGOperation_All);
-  dVect2D p(20, 40);
-  EXPECT_TRUE(view.VGObjectView::ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, p));
-  EXPECT_EQ(At(view), "10 20");
-  EXPECT_TRUE(view.IsVisible());
-  EXPECT_TRUE(view.IsSelected());
-  EXPECT_EQ(view.GetOpState(), 0);
-  EXPECT_EQ(view.GetROPMode(), 13);
-  dVect2D away(60, 60);
-  EXPECT_FALSE(view.VGObjectView::ProcessMouseEvent(MouseEvent_Move, MK_LBUTTON, away));
-  EXPECT_EQ(At(view), "10 20");
-}
-
-TEST(VGPointView, CreationNeedsOnlyTheClick) {
-  VGPointView view;
-  dVect2D p(20, 40);
-  EXPECT_FALSE(view.OnCreate(MouseEvent_Move, MK_LBUTTON, p));
-  EXPECT_FALSE(view.OnCreate(MouseEvent_ButtonUp, MK_LBUTTON, p));
-  EXPECT_EQ(At(view), "0 0");
-  EXPECT_TRUE(view.OnCreate(MouseEvent_ButtonDown, 0, p));
-  EXPECT_EQ(At(view), "20 40");
-}
-
 /// A dot of the device's pen.
 Pixels DotOf(int width, int x, int y) {
   Canvas canvas(32, 32);
@@ -153,18 +89,11 @@ TEST(VGPointView, IsDrawnAsADotWhereTheViewportShowsIt) {
   EXPECT_EQ(At(view.GetViewData()), "10 14");
   EXPECT_EQ(GetCurrentObject(canvas, OBJ_PEN), pen);
   EXPECT_EQ(RopOf(canvas), R2_COPYPEN);
-}
-
-TEST(VGPointView, SelectionIsADotOfWidthFive) {
-  Canvas canvas(32, 32);
   canvas.Fill(0);
-  VGPointView view = PointView(10.9F, 14.9F);
-  view.SetPenThickness(9);
-  view.DrawSelection(canvas);
-  EXPECT_EQ(Lit(canvas), DotOf(5, 10, 14));
   view.SetROPMode(R2_XORPEN);
-  view.DrawSelection(canvas);
-  EXPECT_EQ(Lit(canvas), Pixels{});
+  view.DrawGraphic(canvas);
+  view.DrawGraphic(canvas);
+  EXPECT_EQ(Lit(canvas), Pixels{}) << "drawn twice, it is gone";
 }
 
 }  // namespace

@@ -173,6 +173,12 @@ TEST(VGRectView, SelectionForgetsTheEdges) {
   EXPECT_TRUE(view.OnModify(p));
   EXPECT_EQ(Corners(view), "10 20 - 50 80");
   EXPECT_EQ(StateAt(view, 10, 20), 4);
+  view.ResetViewState(VGViewState_Visible);
+  EXPECT_EQ(StateAt(view, 10, 20), 0);
+  EXPECT_TRUE(view.OnModify(p));
+  EXPECT_EQ(Corners(view), "10 20 - 50 80") << "nor while it is not seen";
+  view.SetViewState(VGViewState_Visible);
+  EXPECT_EQ(StateAt(view, 10, 20), 4);
   EXPECT_TRUE(view.OnEndModify(p));
   EXPECT_TRUE(view.OnModify(p));
   EXPECT_EQ(Corners(view), "10 20 - 50 80");
@@ -280,10 +286,14 @@ TEST(VGRectView, DragInXorLeavesNoTrace) {
   Canvas canvas(64, 64);
   canvas.Fill(0);
   VGRectView view = RectView(10, 10, 30, 30);
+  view.SetPenThickness(3);
   view.SetROPMode(R2_XORPEN);
-  view.DrawGraphic(canvas);
-  EXPECT_FALSE(Lit(canvas).empty());
-  view.DrawGraphic(canvas);
+  view.Select(true);
+  view.VGObjectView::Draw(canvas);
+  EXPECT_EQ(canvas.At(15, 9), 0x0000FFU);
+  EXPECT_EQ(canvas.At(15, 11), 0x0000FFU);
+  EXPECT_EQ(canvas.At(15, 12), 0U);
+  view.VGObjectView::Draw(canvas);
   EXPECT_EQ(Lit(canvas), Pixels{});
 }
 

@@ -173,24 +173,6 @@ TEST(VGTextViewDraw, DeviceContextIsRestored) {
   EXPECT_NE(DeleteObject(font), 0) << "no context holds it any more";
 }
 
-TEST(VGTextViewDraw, SelectionIsADotAtTheAnchor) {
-  Canvas canvas(32, 32);
-  canvas.Fill(0);
-  Canvas expected(32, 32);
-  expected.Fill(0);
-  HPEN pen = CreatePen(PS_SOLID, 5, 0x0000FF);
-  HGDIOBJ old = SelectObject(expected, pen);
-  MoveToEx(expected, 12, 20, nullptr);
-  LineTo(expected, 12, 20);
-  SelectObject(expected, old);
-  DeleteObject(pen);
-  VGTextView view = TextView("", 12.9F, 20.1F, 15);
-  view.Select(true);
-  view.VGObjectView::Draw(canvas);
-  EXPECT_EQ(Lit(canvas), Lit(expected));
-  EXPECT_FALSE(Lit(canvas).empty());
-}
-
 TEST(VGTextViewDraw, NothingAndNowhereAreDrawnWithoutHarm) {
   Canvas canvas(16, 16);
   canvas.Fill(0);

@@ -8,9 +8,6 @@ namespace {
 
 using gui_testing::At;
 using gui_testing::BoxOf;
-using gui_testing::Hand;
-using gui_testing::IsHit;
-using gui_testing::StateAt;
 
 /// A visible, selectable text that may be moved.
 VGTextView TextView(float x, float y) {
@@ -136,70 +133,6 @@ TEST(VGTextView, CopiesFromTextsAndViews) {
   view = text;
   EXPECT_EQ(At(view.GetViewPos()), "2 2");
   EXPECT_EQ(view.GetFont(), font);
-}
-
-TEST(VGTextView, IsHitAndGrabbedAtItsAnchorOnly) {
-  VGTextView view = TextView(10, 10);
-  EXPECT_TRUE(IsHit(view, 13, 14, 5));
-  EXPECT_FALSE(IsHit(view, 14, 14, 5));
-  EXPECT_EQ(StateAt(view, 10, 14), 8);
-  EXPECT_EQ(StateAt(view, 10, 15), 0);
-  EXPECT_EQ(StateAt(view, 16, 12), 0) << "on the letters";
-  view.Enable(VGOperation_All);
-  EXPECT_EQ(StateAt(view, 10, 10), 8);
-  view.SetSelectionDistances(9, 1);
-  EXPECT_EQ(StateAt(view, 10, 12), 0);
-  view.Disable(2);
-  EXPECT_EQ(StateAt(view, 10, 10), 0);
-  view.Enable(2);
-  view.ResetViewState(2);
-  EXPECT_EQ(StateAt(view, 10, 10), 0);
-}
-
-TEST(VGTextView, DragPutsTheAnchorUnderTheMouse) {
-  Scale2D scale(2, 2, 0, 0);
-  VGTextView view = TextView(10, 10);
-  Hand hand(view);
-  hand.handler.SetTransformation(&scale);
-  EXPECT_TRUE(hand.Down(22, 20));
-  EXPECT_EQ(view.GetROPMode(), 7);
-  EXPECT_EQ(view.GetOpState(), 8);
-  EXPECT_EQ(At(view.GetPos()), "10 10");
-  EXPECT_TRUE(hand.Move(32, 40));
-  EXPECT_EQ(At(view.GetPos()), "16 20");
-  EXPECT_EQ(At(view.GetViewPos()), "32 40");
-  EXPECT_TRUE(hand.Up(90, 90));
-  EXPECT_EQ(At(view.GetPos()), "16 20");
-  EXPECT_EQ(view.GetROPMode(), 13);
-  EXPECT_EQ(view.GetOpState(), 0);
-}
-
-TEST(VGTextView, ClickCreatesItAtOnce) {
-  Scale2D scale(2, 2, 0, 0);
-  VGTextView view;
-  view.SetTransformation(&scale);
-  view.Enable(VGOperation_All);
-  dVect2D p(20, 40);
-  EXPECT_TRUE(view.VGObjectView::ProcessMouseEvent(MouseEvent_ButtonDown, MK_LBUTTON, p));
-  EXPECT_EQ(At(view.GetPos()), "10 20");
-  EXPECT_TRUE(view.IsVisible());
-  EXPECT_TRUE(view.IsSelected());
-  EXPECT_EQ(view.GetOpState(), 0);
-  EXPECT_EQ(view.GetROPMode(), 13);
-  dVect2D away(60, 60);
-  EXPECT_FALSE(view.VGObjectView::ProcessMouseEvent(MouseEvent_Move, MK_LBUTTON, away));
-  EXPECT_EQ(At(view.GetPos()), "10 20");
-}
-
-TEST(VGTextView, CreationNeedsOnlyTheClick) {
-  VGTextView view;
-  dVect2D p(20, 40);
-  EXPECT_FALSE(view.OnCreate(MouseEvent_Move, MK_LBUTTON, p));
-  EXPECT_FALSE(view.OnCreate(MouseEvent_ButtonUp, MK_LBUTTON, p));
-  EXPECT_EQ(At(view.GetPos()), "0 0");
-  EXPECT_FALSE(view.IsVisible());
-  EXPECT_TRUE(view.OnCreate(MouseEvent_ButtonDown, 0, p));
-  EXPECT_EQ(At(view.GetPos()), "20 40");
 }
 
 }  // namespace

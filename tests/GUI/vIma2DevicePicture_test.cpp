@@ -4,10 +4,8 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <filesystem>
-
 #include "Canvas.h"
+#include "PictureTesting.h"
 
 namespace {
 
@@ -87,26 +85,7 @@ void DrawAll(Canvas& canvas) {
 TEST(vIma2DevicePicture, IsTheOneThatWasLookedAt) {
   Canvas canvas(240, 160);
   DrawAll(canvas);
-  const std::string path = VORL_REFERENCE_PICTURES "/vIma2Device.bmp";
-  if (std::getenv("VORL_UPDATE_PICTURES") != nullptr) {
-    ASSERT_TRUE(canvas.Bitmap().Save(path.c_str(), true)) << canvas.Bitmap().GetStatus();
-  }
-  const dDIB expected(path.c_str());
-  ASSERT_TRUE(expected.IsValid()) << expected.GetStatus();
-  ASSERT_EQ(expected.GetWidth(), 240U);
-  ASSERT_EQ(expected.GetHeight(), 160U);
-  int differing = 0;
-  for (int y = 0; y < 160; ++y) {
-    for (int x = 0; x < 240; ++x) {
-      differing += canvas.At(x, y) != PixelOf(expected, x, y) ? 1 : 0;
-    }
-  }
-  EXPECT_EQ(differing, 0);
-  if (differing != 0) {
-    const auto actual = std::filesystem::temp_directory_path() / "vIma2Device-actual.bmp";
-    canvas.Bitmap().Save(actual.string().c_str(), true);
-    ADD_FAILURE() << "the actual picture is " << actual;
-  }
+  gui_testing::ExpectPicture(canvas, "vIma2Device");
 }
 
 }  // namespace

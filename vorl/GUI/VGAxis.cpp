@@ -163,6 +163,7 @@ VGAxisView& VGAxisView::operator=(const VGAxisView& source) {
   m_unit = source.m_unit;
   m_labelFont = source.m_labelFont;
   m_unitFont = source.m_unitFont;
+  m_hasUnitTextPlace = source.m_hasUnitTextPlace;
   m_unitTextPos = source.m_unitTextPos;
   m_unitTextAlignment = source.m_unitTextAlignment;
   m_unitTextColor = source.m_unitTextColor;
@@ -237,10 +238,12 @@ void VGAxisView::SetGrayColor(long color) {
 }
 
 void VGAxisView::SetUnitTextPos(const dVect2D& pos) {
+  m_hasUnitTextPlace = true;
   m_unitTextPos = pos;
 }
 
 void VGAxisView::SetUnitTextAlignment(int alignment) {
+  m_hasUnitTextPlace = true;
   m_unitTextAlignment = alignment;
 }
 
@@ -348,13 +351,10 @@ void VGAxisView::CalcValueFormat(double value, char* format) const {
   if (format == nullptr) {
     return;
   }
-  dVect2D vector;
-  vector.Set(IsHorizontal() ? value : 0.0, IsHorizontal() ? 0.0 : value);
-  const dVect2D unmapped(vector);
-  GetTransformation()->vA2B(vector);
-  if (vector.x != unmapped.x || vector.y != unmapped.y) {  // else the value keeps its precision
-    value = IsHorizontal() ? vector.x : vector.y;
-  }
+  double x = 0.0;
+  double y = 0.0;
+  GetTransformation()->vA2B(IsHorizontal() ? value : 0.0, IsHorizontal() ? 0.0 : value, x, y);
+  value = IsHorizontal() ? x : y;
   if (m_unit != nullptr) {
     value = m_unit->A2B(value);
   }

@@ -78,9 +78,14 @@ class VORL_API VGAxis : public VGObject {
 /// An axis that is shown with a scale: main ticks at round values, shorter ticks between them,
 /// labels, an arrow, a unit text, and up to two highlighted values. The mouse does nothing with it.
 ///
-/// *Values* are graphic coordinates, or with an axis unit what that makes of them. Labels stand
-/// below a horizontal and left of a vertical axis, highlighted values on the other side. No text is
-/// drawn over another one or across the edge of the clip box: it is left out.
+/// *Values* are graphic coordinates, or with an axis unit what that makes of them. Those of an
+/// integer unit have ticks at whole numbers only.
+///
+/// *Places.* Ticks and labels stand below a horizontal and left of a vertical axis, or on the other
+/// side where the clip box has room for labels only there; highlighted values and the unit text
+/// stand opposite to them. Labels are at each main tick, or where these are too close at every
+/// second, fifth, tenth ... so that they show round numbers at equal distances. No text is drawn
+/// over another one or across the edge of the clip box: it is left out.
 ///
 /// After a change with the functions of `VGAxis`, `Transform(false)` refreshes the view.
 class VORL_API VGAxisView : public VGAxis, public VGObjectView {
@@ -118,15 +123,18 @@ class VORL_API VGAxisView : public VGAxis, public VGObjectView {
   /// The unit stays the caller's and must live as long as it is set. Null, the default: none.
   void SetAxisUnit(UnitTrafo* unit);
   UnitTrafo* GetAxisUnit() const;
-  /// The fonts of labels and unit text stay the caller's. Null, the default: the device context's.
+  /// The fonts of labels and unit text stay the caller's. Null, the default: the device context's
+  /// for labels, that of the labels for the unit text.
   void SetAxisFonts(HFONT labelFont, HFONT unitFont);
 
   /// The colour of the shorter ticks, 0x808080 by default.
   void SetGrayColor(long color);
 
-  /// Where the unit text stands, in device units from the end of the axis: by default (0, -6).
+  /// Where the unit text stands, in device units from the end of the axis. Until this or the
+  /// alignment is set it stands beside the arrow, on the side that has room; after that, the other
+  /// one of the two is (0, -6) or 5.
   void SetUnitTextPos(const dVect2D& pos);
-  /// As the alignment of `VGText`; by default 5, its bottom right corner.
+  /// As the alignment of `VGText`.
   void SetUnitTextAlignment(int alignment);
   /// 0x00bbggrr, by default as the axis is.
   void SetUnitTextColor(long color);
@@ -179,6 +187,7 @@ class VORL_API VGAxisView : public VGAxis, public VGObjectView {
   UnitTrafo* m_unit = nullptr;
   HFONT m_labelFont = nullptr;
   HFONT m_unitFont = nullptr;
+  bool m_hasUnitTextPlace = false;  ///< one that was set
   dVect2D m_unitTextPos{0.0F, -6.0F};
   int m_unitTextAlignment = 5;
   std::uint32_t m_unitTextColor;

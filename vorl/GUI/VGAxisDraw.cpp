@@ -1,19 +1,25 @@
-// How an axis is drawn: its line, the highlighted values and the unit text, and then ticks and
-// labels as far as the clip box shows them. A text that finds no room is left out, so what is drawn
-// first is what matters most.
+// How an axis is drawn, as far as the clip box shows it:
+//
+// 1. the ticks, then the line and the arrow over them,
+// 2. the highlighted values,
+// 3. the unit text,
+// 4. the labels, at as many main ticks as have room for one.
+//
+// A text that finds no room is left out, so what is written first is what matters most.
 #include <vorl/GUI/VGAxis.h>
 
 #include <vorl/GUI/Trafo1D.h>
+#include <vorl/GUI/detail/AxisScale.h>
 #include <vorl/GUI/detail/ShapePen.h>
 #include <vorl/GUI/detail/ShapeText.h>
 
 #include <algorithm>
 #include <cmath>
 #include <cstdio>
-#include <utility>
 
 inline namespace vorl {
 
+using vorl_detail::AxisScale;
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
 using vorl_detail::TextBox;
@@ -25,14 +31,10 @@ namespace {
 
 constexpr int kMainTick = 8;
 constexpr int kMinorTick = 4;
-constexpr int kHLMark = 10;  ///< to both sides
+constexpr int kHLMark = 9;  ///< to both sides: labels begin where it ends
 constexpr int kArrowLength = 8;
 constexpr int kArrowWidth = 4;  ///< to both sides
 constexpr int kTextGap = 2;
-/// Ticks that are closer than this, in device units, cannot be told apart.
-constexpr double kLeastDistance = 4.0;
-/// From here on neighbouring multiples of a step are not exact any more.
-constexpr double kMostSteps = 1e15;
 /// The longest number: 309 digits, as many decimals as a format has, sign and point.
 constexpr std::size_t kLabelSize = 700;
 
@@ -47,51 +49,90 @@ bool AreTooClose(const tagRECT& a, const tagRECT& b) {
          a.top < b.bottom && b.top < a.bottom;
 }
 
+bool Holds(const tagRECT& rect, double x, double y) {
+  return x >= rect.left && x < rect.right && y >= rect.top && y < rect.bottom;
+}
+
+/// How far a span has to be moved to lie between two limits.
+int WayInto(int from, int to, int low, int high) {
+  const std::int64_t way = std::int64_t{low} - from;
+  return ToDevice(way > 0 ? way : std::min<std::int64_t>(0, std::int64_t{high} - to));
+}
+
 }  // namespace
 
-/// One drawing of an axis.
+/// One drawing of an axis. The label font is selected.
 class VGAxisView::Painter {
  public:
-  Painter(HDC dc, const VGAxisView& view) : m_dc(dc), m_view(view) {
-    view.GetValueRange(m_start, m_end);
-    m_step = view.CalcScalaValueDistance();
-    m_length = view.m_viewVector.Length();
+  Painter(HDC dc, const VGAxisView& view)
+      : m_dc(dc),
+        m_view(view),
+        m_isHorizontal(view.IsHorizontal()),
+        m_isInteger(view.m_unit != nullptr && view.m_unit->IsIntegerUnit()),
+        m_length(view.m_viewVector.Length()),
+        m_scale(ScaleOf(view, m_length, m_isInteger)) {
     GetClipBox(dc, &m_clip);
-    ChooseSteps();
+    const double margin = std::abs(static_cast<double>(view.GetPenThickness())) + 1.0;
+    m_hasScale = m_scale.Step() > 0.0;
+    if (m_hasScale) {
+      // All the decimals that tell the labels apart.
+      m_decimals = view.FormatOf(m_scale.Step()).decimals;
+      m_decimals = m_isInteger ? m_decimals : std::max(m_decimals, -m_scale.Exponent());
+      m_hasScale = m_scale.Show(view.m_viewPos, view.m_viewVector, m_clip, margin);
+    }
+    if (m_hasScale && Shows(VGAxisDisplay_Labels)) {
+      PlanLabels();
+    }
+  }
+
+  void DrawTicks() const {
+    if (!Shows(VGAxisDisplay_Ticks) || !m_hasScale) {
+      return;
+    }
+    const double mainStep = m_scale.Step();
+    if (m_scale.Parts() > 1) {
+      const ColoredPen pen(m_dc, m_view, m_view.m_gray);
+      const double minorStep = mainStep / m_scale.Parts();
+      m_scale.ForEachStep(minorStep, [&](double step) {
+        if (std::fmod(step, m_scale.Parts()) != 0.0) {
+          DrawTick(pen, step * minorStep, kMinorTick);
+        }
+      });
+    }
+    const ColoredPen pen(m_dc, m_view, static_cast<std::uint32_t>(m_view.GetPenColor()));
+    m_scale.ForEachStep(mainStep, [&](double step) { DrawTick(pen, step * mainStep, kMainTick); });
   }
 
   void DrawLine() const {
     const ShapePen pen(m_dc, m_view, m_view.GetPenThickness());
     if (Shows(VGAxisDisplay_Line)) {
-      pen.Line(m_view.m_viewPos, m_view.m_viewPos + m_view.m_viewVector);
+      pen.Line(m_view.m_viewPos, Tip());
     }
     if (Shows(VGAxisDisplay_Arrow) && m_length > 0.0) {
-      const dVect2D tip = m_view.m_viewPos + m_view.m_viewVector;
       const dVect2D along = m_view.m_viewVector * (1.0 / m_length);
-      const dVect2D back = tip - along * kArrowLength;
+      const dVect2D back = Tip() - along * kArrowLength;
       const dVect2D aside(-along.y * kArrowWidth, along.x * kArrowWidth);
-      pen.Line(tip, back + aside);
-      pen.Line(tip, back - aside);
+      pen.Line(Tip(), back + aside);
+      pen.Line(Tip(), back - aside);
     }
   }
 
   void DrawHLValues() {
     for (const HLValue& hl : m_view.m_hlValues) {
-      const double t = PlaceOf(hl.value);
+      const double t = m_scale.PlaceOf(hl.value);
       if (!hl.isEnabled || !(t >= 0.0 && t <= 1.0)) {
         continue;
       }
       if (hl.type != VGAxisHLType_Value) {
         const ColoredPen pen(m_dc, m_view, hl.color);
-        pen.Across(At(t), m_view.IsHorizontal(), -kHLMark, kHLMark + 1);
+        pen.Across(At(t), m_isHorizontal, -kHLMark, kHLMark + 1);
       }
       if (hl.type != VGAxisHLType_Mark) {
         // One decimal more than the scale has: they lie between its ticks.
-        const bool isInteger = m_view.m_unit != nullptr && m_view.m_unit->IsIntegerUnit();
         char text[kLabelSize];
-        Print(text, hl.value, m_decimals + (isInteger ? 0 : 1));
+        Print(text, hl.value, m_decimals + (m_isInteger ? 0 : 1));
         const TextStyle style(m_dc, hl.color, OPAQUE, hl.bgColor, m_view.m_labelFont);
-        Write(text, BesideAxis(At(t), -(kHLMark + kTextGap)), m_view.IsHorizontal() ? 13 : 3);
+        WriteHLValue(text, At(t));
       }
     }
   }
@@ -101,38 +142,32 @@ class VGAxisView::Painter {
     if (m_view.m_unit != nullptr && *m_view.m_unit->GetShortUnitText() != '\0') {
       text = m_view.m_unit->GetShortUnitText();
     }
-    if (Shows(VGAxisDisplay_UnitText) && *text != '\0') {
-      const TextStyle style(m_dc, m_view.m_unitTextColor, TRANSPARENT, 0, m_view.m_unitFont);
-      Write(text, m_view.m_viewPos + m_view.m_viewVector + m_view.m_unitTextPos,
-            m_view.m_unitTextAlignment);
+    if (!Shows(VGAxisDisplay_UnitText) || *text == '\0') {
+      return;
+    }
+    const TextStyle style(m_dc, m_view.m_unitTextColor, TRANSPARENT, 0, m_view.m_unitFont);
+    if (m_view.m_hasUnitTextPlace) {
+      Write(text, BoxOf(text, Tip() + m_view.m_unitTextPos, m_view.m_unitTextAlignment));
+    } else if (!Write(text, UnitTextBox(text, -m_side))) {
+      Write(text, UnitTextBox(text, m_side));
     }
   }
 
-  void DrawScala() {
-    double first = 0.0;
-    double last = 0.0;
-    if (m_step <= 0.0 || !ShownRange(first, last)) {
+  void DrawLabels() {
+    if (!Shows(VGAxisDisplay_Labels) || !m_hasScale) {
       return;
     }
-    if (Shows(VGAxisDisplay_Ticks) && m_parts > 1) {
-      const ColoredPen pen(m_dc, m_view, m_view.m_gray);
-      const double minorStep = m_step / m_parts;
-      ForEachStep(first, last, minorStep, [&](double step) {
-        if (std::fmod(step, m_parts) != 0.0) {
-          DrawTick(pen, step * minorStep, kMinorTick);
-        }
-      });
-    }
-    if (Shows(VGAxisDisplay_Ticks)) {
-      const ColoredPen pen(m_dc, m_view, static_cast<std::uint32_t>(m_view.GetPenColor()));
-      ForEachStep(first, last, m_step,
-                  [&](double step) { DrawTick(pen, step * m_step, kMainTick); });
-    }
-    if (Shows(VGAxisDisplay_Labels)) {
-      const TextStyle style(m_dc, m_view.GetPenColor(), TRANSPARENT, 0, m_view.m_labelFont);
-      m_isLabel = true;
-      ForEachStep(first, last, m_step, [&](double step) { DrawLabel(step * m_step); });
-    }
+    const TextStyle style(m_dc, m_view.GetPenColor(), TRANSPARENT, 0, m_view.m_labelFont);
+    m_isLabel = true;
+    const double mainStep = m_scale.Step();
+    m_scale.ForEachStep(mainStep, [&](double step) {
+      if (std::fmod(step, m_stride) == 0.0) {
+        char text[kLabelSize];
+        Print(text, step * mainStep, m_decimals);
+        Write(text,
+              BoxBeside(text, At(m_scale.PlaceOf(step * mainStep)), m_side, kMainTick + kTextGap));
+      }
+    });
   }
 
  private:
@@ -169,30 +204,47 @@ class VGAxisView::Painter {
 
   bool Shows(int flag) const { return (m_view.m_displayFlags & flag) != 0; }
 
-  /// Widens steps that are too narrow to be seen, and parts them by ticks at round values.
-  void ChooseSteps() {
-    const double perValue = m_length / std::abs(m_end - m_start);
-    if (!(m_step > 0.0) || !std::isfinite(perValue) || !(perValue > 0.0)) {
-      m_step = 0.0;
-      return;
-    }
-    while (m_step * perValue < kLeastDistance) {
-      m_step *= 10.0;
-    }
-    const double exponent = std::floor(std::log10(m_step * 1.001));
-    const double mantissa = m_step / std::pow(10.0, exponent);
-    const int parts = mantissa > 1.5 && mantissa < 3.0 ? 4 : 5;
-    m_parts = m_step * perValue / parts >= kLeastDistance ? parts : 1;
-    const bool isInteger = m_view.m_unit != nullptr && m_view.m_unit->IsIntegerUnit();
-    // All the decimals that tell the labels apart.
-    m_decimals = m_view.FormatOf(m_step).decimals;
-    if (!isInteger && exponent < 0.0) {
-      m_decimals = std::max(m_decimals, Truncated<int>(-exponent));
-    }
+  dVect2D Tip() const { return m_view.m_viewPos + m_view.m_viewVector; }
+
+  static AxisScale ScaleOf(const VGAxisView& view, double length, bool isInteger) {
+    double start = 0.0;
+    double end = 0.0;
+    view.GetValueRange(start, end);
+    return {start, end, length, view.CalcScalaValueDistance(), isInteger};
   }
 
-  /// Where a value stands, in lengths of the axis.
-  double PlaceOf(double value) const { return (value - m_start) / (m_end - m_start); }
+  /// Chooses the side of the labels, and how many main ticks lead from one to the next, by the
+  /// sizes of the first and the last one.
+  void PlanLabels() {
+    int width = 0;
+    int height = 0;
+    const double step = m_scale.Step();
+    for (const double value :
+         {std::ceil(m_scale.First() / step) * step, std::floor(m_scale.Last() / step) * step}) {
+      char text[kLabelSize];
+      Print(text, value, m_decimals);
+      const tagRECT box = BoxOf(text, dVect2D(), 0);
+      width = std::max(width, static_cast<int>(box.right));
+      height = std::max(height, static_cast<int>(box.bottom));
+    }
+    const double room = kMainTick + kTextGap + (m_isHorizontal ? height : width);
+    m_side = !HasRoom(1, room) && HasRoom(-1, room) ? -1 : 1;
+    const dVect2D& way = m_view.m_viewVector;
+    const double distance = std::abs(m_scale.LengthOf(step) * (m_isHorizontal ? way.x : way.y));
+    m_stride = m_scale.StrideFor((m_isHorizontal ? width : height) + kTextGap, distance);
+  }
+
+  /// Whether there is room on a side of all the axis.
+  bool HasRoom(int side, double room) const {
+    const dVect2D& pos = m_view.m_viewPos;
+    const dVect2D tip = Tip();
+    if (m_isHorizontal) {
+      return side > 0 ? std::max(pos.y, tip.y) + room <= m_clip.bottom
+                      : std::min(pos.y, tip.y) - room >= m_clip.top;
+    }
+    return side > 0 ? std::min(pos.x, tip.x) - room >= m_clip.left
+                    : std::max(pos.x, tip.x) + room <= m_clip.right;
+  }
 
   dVect2D At(double t) const {
     // A hair is added, so that a place that was meant to be whole is not cut down to the one
@@ -204,78 +256,67 @@ class VGAxisView::Painter {
     return pos;
   }
 
-  dVect2D BesideAxis(dVect2D pos, int way) const {
-    if (m_view.IsHorizontal()) {
-      pos.Add(0.0, way);
-    } else {
-      pos.Add(-way, 0.0);
-    }
-    return pos;
-  }
-
-  /// The values, in order, between which ticks can be seen. False where there are none.
-  bool ShownRange(double& first, double& last) const {
-    const dVect2D& pos = m_view.m_viewPos;
-    const dVect2D& way = m_view.m_viewVector;
-    const bool alongX = std::abs(way.x) >= std::abs(way.y);
-    const double margin = std::abs(static_cast<double>(m_view.GetPenThickness())) + 1.0;
-    const double low = (alongX ? m_clip.left : m_clip.top) - margin;
-    const double high = (alongX ? m_clip.right : m_clip.bottom) + margin;
-    double from = (low - (alongX ? pos.x : pos.y)) / (alongX ? way.x : way.y);
-    double to = (high - (alongX ? pos.x : pos.y)) / (alongX ? way.x : way.y);
-    if (from > to) {
-      std::swap(from, to);
-    }
-    from = std::max(from, 0.0);
-    to = std::min(to, 1.0);
-    first = m_start + from * (m_end - m_start);
-    last = m_start + to * (m_end - m_start);
-    if (first > last) {
-      std::swap(first, last);
-    }
-    return from <= to;
-  }
-
-  /// Calls `visit` with the number of each multiple of a step from the first value to the last.
-  template <class Visitor>
-  static void ForEachStep(double first, double last, double step, Visitor&& visit) {
-    constexpr double kHair = 1e-6;
-    const double from = std::ceil(first / step - kHair);
-    const double to = std::floor(last / step + kHair);
-    if (std::abs(from) > kMostSteps || std::abs(to) > kMostSteps) {
-      return;
-    }
-    for (double number = from; number <= to; number += 1.0) {
-      visit(number + 0.0);  // never the negative zero
-    }
-  }
-
   void DrawTick(const ColoredPen& pen, double value, int length) const {
-    pen.Across(At(PlaceOf(value)), m_view.IsHorizontal(), 0, length + 1);
-  }
-
-  void DrawLabel(double value) {
-    const bool isInteger = m_view.m_unit != nullptr && m_view.m_unit->IsIntegerUnit();
-    if (isInteger && std::abs(value - std::round(value)) > m_step * 1e-3) {
-      return;
-    }
-    char text[kLabelSize];
-    Print(text, value, m_decimals);
-    Write(text, BesideAxis(At(PlaceOf(value)), kMainTick + kTextGap),
-          m_view.IsHorizontal() ? 12 : 7);
+    pen.Across(At(m_scale.PlaceOf(value)), m_isHorizontal, 0, m_side * (length + 1));
   }
 
   static void Print(char (&text)[kLabelSize], double value, int decimals) {
     std::snprintf(text, kLabelSize, "%.*f", decimals, value);
   }
 
+  /// Ampersands are letters here.
+  tagRECT BoxOf(const char* text, const dVect2D& anchor, int alignment) const {
+    return TextBox(m_dc, text, anchor, alignment, DT_NOPREFIX);
+  }
+
+  /// The box of a text at a distance from the axis: below or left of it on side 1, above or right
+  /// of it on side -1.
+  tagRECT BoxBeside(const char* text, dVect2D pos, int side, int distance) const {
+    if (m_isHorizontal) {
+      pos.Add(0.0, side * distance);
+      return BoxOf(text, pos, side > 0 ? 12 : 13);
+    }
+    pos.Add(-side * distance, 0.0);
+    return BoxOf(text, pos, side > 0 ? 7 : 3);
+  }
+
+  /// The box of the unit text beside the arrow.
+  tagRECT UnitTextBox(const char* text, int side) const {
+    const int distance = side == m_side ? kMainTick + kTextGap : kArrowWidth + kTextGap;
+    const dVect2D& way = m_view.m_viewVector;
+    dVect2D pos = Tip();
+    if (m_isHorizontal) {
+      pos.Add(0.0, side * distance);
+      return BoxOf(text, pos, (side > 0 ? 0 : 1) | (way.x < 0.0F ? 0 : 4));
+    }
+    pos.Add(-side * distance, 0.0);
+    return BoxOf(text, pos, (side > 0 ? 4 : 0) | (way.y < 0.0F ? 0 : 1));
+  }
+
+  /// Away from the labels, or else among them. The text of a value that is seen is moved along the
+  /// axis to be seen, too.
+  void WriteHLValue(const char* text, const dVect2D& pos) {
+    for (const int side : {-m_side, m_side}) {
+      tagRECT box = BoxBeside(text, pos, side, kHLMark + 1 + kTextGap);
+      if (Holds(m_clip, pos.x, pos.y) && m_isHorizontal) {
+        const int way = WayInto(box.left, box.right, m_clip.left, m_clip.right);
+        box = {box.left + way, box.top, box.right + way, box.bottom};
+      } else if (Holds(m_clip, pos.x, pos.y)) {
+        const int way = WayInto(box.top, box.bottom, m_clip.top, m_clip.bottom);
+        box = {box.left, box.top + way, box.right, box.bottom + way};
+      }
+      if (Write(text, box)) {
+        return;
+      }
+    }
+  }
+
   /// Writes a text where there is room for it.
-  void Write(const char* text, const dVect2D& anchor, int alignment) {
-    tagRECT box = TextBox(m_dc, text, anchor, alignment);
+  bool Write(const char* text, tagRECT box) {
     if (!IsInside(box, m_clip) ||
         std::any_of(m_taken, m_taken + m_numTaken,
                     [&box](const tagRECT& other) { return AreTooClose(box, other); })) {
-      return;
+      return false;
     }
     DrawTextA(m_dc, text, -1, &box, DT_NOPREFIX);
     // Labels follow each other: only the last one can be in the way of the next.
@@ -284,17 +325,20 @@ class VGAxisView::Painter {
       m_hasLabel = m_isLabel;
     }
     m_taken[m_numTaken - 1] = box;
+    return true;
   }
 
   HDC m_dc;
   const VGAxisView& m_view;
+  bool m_isHorizontal;
+  bool m_isInteger;  ///< the unit
   tagRECT m_clip{};
-  double m_start = 0.0;
-  double m_end = 0.0;
-  double m_length = 0.0;
-  double m_step = 0.0;  ///< of the main ticks; 0: there is no scale
-  int m_parts = 1;      ///< into which the shorter ticks part it
+  double m_length;
+  AxisScale m_scale;
+  bool m_hasScale = false;
+  double m_stride = 1.0;  ///< main ticks from one label to the next
   int m_decimals = 0;
+  int m_side = 1;           ///< of ticks and labels; -1: above or right of the axis
   tagRECT m_taken[4] = {};  ///< by highlighted values, the unit text and the last label
   int m_numTaken = 0;
   bool m_isLabel = false;
@@ -309,10 +353,11 @@ void VGAxisView::DrawGraphic(HDC dc) {
   // Also for the line, whose gaps, if it has any, are not filled.
   const TextStyle style(dc, GetPenColor(), TRANSPARENT, 0, m_labelFont);
   Painter painter(dc, *this);
+  painter.DrawTicks();
   painter.DrawLine();
   painter.DrawHLValues();
   painter.DrawUnitText();
-  painter.DrawScala();
+  painter.DrawLabels();
 }
 
 }  // namespace vorl

@@ -1,6 +1,5 @@
 #include <vorl/GUI/VGCrossCursorView.h>
 
-#include <algorithm>
 #include <cmath>
 
 #include <vorl/GUI/Geom2D.h>
@@ -15,29 +14,6 @@ using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
 
 namespace {
-
-// Another point of a line, at least as far away as a screen is wide and as the origin is: one close
-// by would lose the direction when it is rounded to single precision. A power of two keeps the
-// ratio of the components exactly.
-dVect2D FarPoint(const dVect2D& pos, const dVect2D& direction) {
-  const double length = direction.Length();
-  const double reach = std::max({2048.0, std::fabs(double{pos.x}), std::fabs(double{pos.y})});
-  const bool isRegular = std::isnormal(length) && std::isfinite(reach);
-  const int exponent = isRegular ? std::ilogb(reach) - std::ilogb(length) : 0;
-  dVect2D point;
-  point.Set(pos.x + std::ldexp(double{direction.x}, exponent),
-            pos.y + std::ldexp(double{direction.y}, exponent));
-  return point;
-}
-
-void DrawLine(const ShapePen& pen, const dVect2D& pos, const dVect2D& direction,
-              const tagRECT& clip) {
-  dVect2D start;
-  dVect2D end;
-  if (Geom2D::ClipLine(pos, FarPoint(pos, direction), clip, start, end)) {
-    pen.Line(start, end);
-  }
-}
 
 // Without angles, so that quarter turns are exact.
 dVect2D Turned(const dVect2D& direction, double cosine, double sine) {
@@ -121,11 +97,11 @@ void VGCrossCursorView::DrawGraphic(HDC dc) {
   const ShapeROP rop(dc, *this);
   if (Shows(CursorMode_First)) {
     const ShapePen pen(dc, *this, GetPenThickness(), m_firstColor);
-    DrawLine(pen, m_viewPos, first, clip);
+    pen.LineThrough(m_viewPos, first, clip);
   }
   if (Shows(CursorMode_Second)) {
     const ShapePen pen(dc, *this, GetPenThickness(), m_secondColor);
-    DrawLine(pen, m_viewPos, second, clip);
+    pen.LineThrough(m_viewPos, second, clip);
   }
   if (m_mode == CursorMode_Both) {
     const ShapePen pen(dc, *this, HandleWidth(GetPenThickness()));
@@ -206,6 +182,7 @@ bool VGCrossCursorView::OnRotate(dVect2D& point) {
   }
   m_first = Turned(m_startFirst, cosine, sine);
   m_second = Turned(m_startSecond, cosine, sine);
+  ViewDataChanged();
   return true;
 }
 

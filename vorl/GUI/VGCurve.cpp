@@ -15,6 +15,7 @@ inline namespace vorl {
 
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
+using vorl_detail::TransparentGaps;
 using vorl_detail::Truncated;
 
 namespace {
@@ -228,6 +229,7 @@ void VGCurveView::DrawGraphic(HDC dc) {
   GetClipBox(dc, &clip);
   const ShapePen pen(dc, *this, GetPenThickness());
   const ShapeROP rop(dc, *this);
+  const TransparentGaps gaps(dc);
   const double reach = std::abs(static_cast<double>(GetPenThickness())) + 1.0;
   const auto isSeen = [&clip](const dVect2D& start, const dVect2D& end, double margin) {
     return std::trunc(std::max(start.x, end.x)) >= clip.left - margin &&

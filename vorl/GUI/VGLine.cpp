@@ -169,17 +169,13 @@ void VGLineView::DrawGraphic(HDC dc) {
   const ShapeROP rop(dc, *this);
   {
     const ShapePen pen(dc, *this, GetPenThickness());
-    dVect2D start = m_viewPos;
-    dVect2D end = ViewEnd();
-    bool isSeen = true;
-    if (GetType() != TLine_Segment) {
+    if (GetType() == TLine_Segment) {
+      pen.Line(m_viewPos, ViewEnd());
+    } else {
       // A little more than can be seen, so that the ends of a wide line stay outside.
       tagRECT clip{};
       GetClipBox(dc, &clip);
-      isSeen = Geom2D::ClipLine(m_viewPos, ViewEnd(), Enlarged(clip, 2), start, end);
-    }
-    if (isSeen) {
-      pen.Line(start, end);
+      pen.LineThrough(m_viewPos, m_viewVector, Enlarged(clip, 2));
     }
   }
   if (IsEnabled(VGOperation_Rotate)) {

@@ -1,20 +1,12 @@
 #include <vorl/GUI/VGPoint.h>
 
-#include <vorl/GUI/Geom2D.h>
 #include <vorl/GUI/GraphicViewPort.h>
-#include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/detail/ShapePen.h>
 
 inline namespace vorl {
 
 using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
-
-namespace {
-
-constexpr int kSelectionWidth = 5;
-
-}  // namespace
 
 VGPoint::VGPoint() = default;
 
@@ -44,7 +36,7 @@ void VGPoint::Transform(Trafo2DBase* trafo, bool toGraphic) {
 
 VGPointView::VGPointView() = default;
 
-VGPointView::VGPointView(const VGPoint& point) : VGPoint(point), m_viewPos(point) {}
+VGPointView::VGPointView(const VGPoint& point) : VGPoint(point), VGAnchorView(point) {}
 
 VGPointView::VGPointView(const VGPointView& source) = default;
 
@@ -55,7 +47,7 @@ VGPointView& VGPointView::operator=(const VGPoint& point) {
 
 VGPointView& VGPointView::operator=(const VGPointView& source) {
   if (this != &source) {
-    VGObjectView::operator=(source);
+    VGAnchorView::operator=(source);
     SetData(source);
   }
   return *this;
@@ -78,18 +70,6 @@ void VGPointView::Transform(bool toGraphic) {
   m_viewPos = view;
 }
 
-bool VGPointView::IsPointOnGraphic(dVect2D& point, int tolerance) {
-  return Geom2D::IsPointOnPoint(point, m_viewPos, tolerance);
-}
-
-short VGPointView::GetSelectionState(int /*flags*/, dVect2D& point) {
-  if (!IsVisible() || !IsEnabled(VGOperation_Select)) {
-    return VGOperation_None;
-  }
-  return Geom2D::IsPointOnPoint(point, m_viewPos, GetHandleDistance()) ? VGOperation_Move
-                                                                       : VGOperation_None;
-}
-
 void VGPointView::DrawGraphic(HDC dc, GraphicViewPort& viewPort) {
   viewPort.GraphicToView(static_cast<const dVect2D&>(*this), m_viewPos);
   DrawGraphic(dc);
@@ -99,46 +79,6 @@ void VGPointView::DrawGraphic(HDC dc) {
   const ShapePen pen(dc, *this, GetPenThickness());
   const ShapeROP rop(dc, *this);
   pen.Dot(m_viewPos);
-}
-
-void VGPointView::DrawSelection(HDC dc) {
-  const ShapePen pen(dc, *this, kSelectionWidth);
-  const ShapeROP rop(dc, *this);
-  pen.Dot(m_viewPos);
-}
-
-void VGPointView::CalcBoundingBox(HDC /*dc*/, dVect2D& min, dVect2D& max) {
-  min = m_viewPos;
-  max = m_viewPos;
-}
-
-// A click is enough, whether creation is enabled or not.
-bool VGPointView::OnCreate(int event, int /*flags*/, dVect2D& point) {
-  if (event != MouseEvent_ButtonDown) {
-    return false;
-  }
-  m_viewPos = point;
-  ViewDataChanged();
-  AssignViewState(VGViewState_Visible | VGViewState_Selected);
-  SetOpState(VGOperation_None);
-  return true;
-}
-
-bool VGPointView::OnBeginMove(dVect2D& /*point*/) {
-  SetROPMode(R2_XORPEN);
-  return true;
-}
-
-bool VGPointView::OnMove(dVect2D& point) {
-  m_viewPos = point;
-  ViewDataChanged();
-  return true;
-}
-
-bool VGPointView::OnEndMove(dVect2D& /*point*/) {
-  SetROPMode(R2_COPYPEN);
-  SetOpState(VGOperation_None);
-  return true;
 }
 
 void VGPointView::SetData(const VGPoint& point) {

@@ -4,8 +4,7 @@
 /// @file
 /// Points and their views.
 
-#include <vorl/Data/dVect2D.h>
-#include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/VGAnchorView.h>
 
 inline namespace vorl {
 
@@ -24,11 +23,11 @@ class VORL_API VGPoint : public VGObject, public dVect2D {
   void Transform(Trafo2DBase* trafo, bool toGraphic);
 };
 
-/// A point that is shown and dragged. While it is dragged it lies under the mouse, and is drawn
-/// with `R2_XORPEN`.
+/// A point that is shown and dragged: see `VGAnchorView`. The dot that selects it is 5 wide, and
+/// does not show on one that is larger.
 ///
 /// After a change with the functions of `VGPoint`, `Transform(false)` refreshes the view.
-class VORL_API VGPointView : public VGPoint, public VGObjectView {
+class VORL_API VGPointView : public VGPoint, public VGAnchorView {
  public:
   VGPointView();
   explicit VGPointView(const VGPoint& point);
@@ -42,25 +41,10 @@ class VORL_API VGPointView : public VGPoint, public VGObjectView {
   VGType GetObjType() override;
   using VGPoint::Transform;
   void Transform(bool toGraphic) override;
-  using VGObjectView::IsPointOnGraphic;
-  bool IsPointOnGraphic(dVect2D& point, int tolerance) override;
-  using VGObjectView::GetSelectionState;
-  short GetSelectionState(int flags, dVect2D& point) override;
   /// Maps the point anew through the viewport and draws it as a dot, as wide as the pen.
   void DrawGraphic(HDC dc, GraphicViewPort& viewPort) override;
   /// The same without mapping.
   void DrawGraphic(HDC dc) override;
-  using VGObjectView::DrawSelection;
-  /// A larger dot.
-  void DrawSelection(HDC dc) override;
-  /// The point as both corners.
-  void CalcBoundingBox(HDC dc, dVect2D& min, dVect2D& max) override;
-
-  /// Puts the point where the click is; that is all.
-  bool OnCreate(int event, int flags, dVect2D& point) override;
-  bool OnBeginMove(dVect2D& point) override;
-  bool OnMove(dVect2D& point) override;
-  bool OnEndMove(dVect2D& point) override;
 
   /// Sets the point in graphic coordinates.
   void SetData(const VGPoint& point);
@@ -69,9 +53,6 @@ class VORL_API VGPointView : public VGPoint, public VGObjectView {
   /// The point in view coordinates.
   VGPoint GetViewData() const;
   void GetViewData(VGPoint& point) const;
-
- private:
-  dVect2D m_viewPos;
 };
 
 }  // namespace vorl

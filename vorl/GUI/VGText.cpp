@@ -1,24 +1,15 @@
 #include <vorl/GUI/VGText.h>
 
-#include <vorl/GUI/Geom2D.h>
-#include <vorl/GUI/InputEventHandler.h>
 #include <vorl/GUI/detail/OwnedText.h>
 #include <vorl/GUI/detail/ShapePen.h>
 #include <vorl/GUI/detail/ShapeText.h>
 
 inline namespace vorl {
 
-using vorl_detail::ShapePen;
 using vorl_detail::ShapeROP;
 using vorl_detail::TextBox;
 using vorl_detail::TextOf;
 using vorl_detail::TextStyle;
-
-namespace {
-
-constexpr int kSelectionWidth = 5;
-
-}  // namespace
 
 VGText::VGText() = default;
 
@@ -84,7 +75,7 @@ void VGText::Transform(Trafo2DBase* trafo, bool toGraphic) {
 
 VGTextView::VGTextView() = default;
 
-VGTextView::VGTextView(const VGText& text) : VGText(text), m_viewPos(text.GetPos()) {}
+VGTextView::VGTextView(const VGText& text) : VGText(text), VGAnchorView(text.GetPos()) {}
 
 VGTextView::VGTextView(const VGTextView& source) = default;
 
@@ -95,7 +86,7 @@ VGTextView& VGTextView::operator=(const VGText& text) {
 
 VGTextView& VGTextView::operator=(const VGTextView& source) {
   if (this != &source) {
-    VGObjectView::operator=(source);
+    VGAnchorView::operator=(source);
     m_font = source.m_font;
     m_isTransparent = source.m_isTransparent;
     m_bgColor = source.m_bgColor;
@@ -125,64 +116,12 @@ void VGTextView::Transform(bool toGraphic) {
   GetTransformation()->pA2B(m_viewPos);
 }
 
-bool VGTextView::IsPointOnGraphic(dVect2D& point, int tolerance) {
-  return Geom2D::IsPointOnPoint(point, m_viewPos, tolerance);
-}
-
-short VGTextView::GetSelectionState(int /*flags*/, dVect2D& point) {
-  if (!IsVisible() || !IsEnabled(VGOperation_Select)) {
-    return VGOperation_None;
-  }
-  return Geom2D::IsPointOnPoint(point, m_viewPos, GetHandleDistance()) ? VGOperation_Move
-                                                                       : VGOperation_None;
-}
-
 void VGTextView::DrawGraphic(HDC dc) {
   const ShapeROP rop(dc, *this);
   const TextStyle style(dc, GetPenColor(), m_isTransparent ? TRANSPARENT : OPAQUE, GetBgColor(),
                         m_font);
   tagRECT box = TextBox(dc, GetText(), m_viewPos, GetAlignment());
   DrawTextA(dc, GetText(), -1, &box, 0);
-}
-
-void VGTextView::DrawSelection(HDC dc) {
-  const ShapePen pen(dc, *this, kSelectionWidth);
-  const ShapeROP rop(dc, *this);
-  pen.Dot(m_viewPos);
-}
-
-void VGTextView::CalcBoundingBox(HDC /*dc*/, dVect2D& min, dVect2D& max) {
-  min = m_viewPos;
-  max = m_viewPos;
-}
-
-// A click is enough, whether creation is enabled or not.
-bool VGTextView::OnCreate(int event, int /*flags*/, dVect2D& point) {
-  if (event != MouseEvent_ButtonDown) {
-    return false;
-  }
-  m_viewPos = point;
-  ViewDataChanged();
-  AssignViewState(VGViewState_Visible | VGViewState_Selected);
-  SetOpState(VGOperation_None);
-  return true;
-}
-
-bool VGTextView::OnBeginMove(dVect2D& /*point*/) {
-  SetROPMode(R2_XORPEN);
-  return true;
-}
-
-bool VGTextView::OnMove(dVect2D& point) {
-  m_viewPos = point;
-  ViewDataChanged();
-  return true;
-}
-
-bool VGTextView::OnEndMove(dVect2D& /*point*/) {
-  SetROPMode(R2_COPYPEN);
-  SetOpState(VGOperation_None);
-  return true;
 }
 
 void VGTextView::SetData(const VGText& text) {

@@ -4,7 +4,7 @@
 /// @file
 /// Text labels and their views.
 
-#include <vorl/GUI/VGObjectView.h>
+#include <vorl/GUI/VGAnchorView.h>
 #include <vorl/Platform/GdiFwd.h>
 
 #include <cstdint>
@@ -48,15 +48,14 @@ class VORL_API VGText : public VGObject {
   std::int16_t m_alignment = 15;
 };
 
-/// A text that is shown in the pen colour, and dragged by its anchor. While it is dragged the
-/// anchor lies under the mouse.
+/// A text that is shown in the pen colour, and dragged by its anchor: see `VGAnchorView`.
 ///
 /// The device writes it: an ampersand underlines the character that follows it, two stand for one,
 /// and the text takes no notice of the raster operation.
 ///
 /// After a change of the anchor with the functions of `VGText`, `Transform(false)` refreshes the
 /// view.
-class VORL_API VGTextView : public VGText, public VGObjectView {
+class VORL_API VGTextView : public VGText, public VGAnchorView {
  public:
   /// In the device context's font, transparent.
   VGTextView();
@@ -73,24 +72,8 @@ class VORL_API VGTextView : public VGText, public VGObjectView {
   VGType GetObjType() override;
   using VGText::Transform;
   void Transform(bool toGraphic) override;
-  using VGObjectView::IsPointOnGraphic;
-  /// The point is near the anchor.
-  bool IsPointOnGraphic(dVect2D& point, int tolerance) override;
-  using VGObjectView::GetSelectionState;
-  short GetSelectionState(int flags, dVect2D& point) override;
   using VGObjectView::DrawGraphic;
   void DrawGraphic(HDC dc) override;
-  using VGObjectView::DrawSelection;
-  /// A dot at the anchor.
-  void DrawSelection(HDC dc) override;
-  /// The anchor as both corners.
-  void CalcBoundingBox(HDC dc, dVect2D& min, dVect2D& max) override;
-
-  /// Puts the anchor where the click is; that is all.
-  bool OnCreate(int event, int flags, dVect2D& point) override;
-  bool OnBeginMove(dVect2D& point) override;
-  bool OnMove(dVect2D& point) override;
-  bool OnEndMove(dVect2D& point) override;
 
   /// Sets the text, the anchor in graphic coordinates and the alignment.
   void SetData(const VGText& text);
@@ -110,7 +93,6 @@ class VORL_API VGTextView : public VGText, public VGObjectView {
   long GetBgColor() const;
 
  private:
-  dVect2D m_viewPos;
   HFONT m_font = nullptr;
   bool m_isTransparent = true;
   std::uint32_t m_bgColor = 0xFFFFFF;

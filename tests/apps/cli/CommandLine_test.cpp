@@ -22,9 +22,9 @@ TEST(CommandLine, HelpNamesAllCommandsAndGivesExamples) {
   EXPECT_EQ(outcome.code, 0);
   EXPECT_EQ(outcome.errors, "");
   EXPECT_TRUE(Contains(outcome.output, "Usage: vorl COMMAND ..."));
-  for (const char* part :
-       {"\n  info ", "\n  mpr ", "\n  mip ", "\n  project ", "\n  select ", "\n  convert ",
-        "\n  phantom ", "\n  bmp ", "Examples:\n", "The exit code is 0 after success"}) {
+  for (const char* part : {"\n  info ", "\n  mpr ", "\n  mip ", "\n  project ", "\n  render ",
+                           "\n  select ", "\n  convert ", "\n  phantom ", "\n  bmp ", "Examples:\n",
+                           "The exit code is 0 after success"}) {
     EXPECT_TRUE(Contains(outcome.output, part)) << part;
   }
   EXPECT_EQ(RunTool({"-h"}).output, outcome.output);
@@ -75,6 +75,11 @@ INSTANTIATE_TEST_SUITE_P(
                  {"-o,--output FILE", "--plane NAME", "--center X,Y,Z", "--rotate X,Y,Z",
                   "--size WxH", "--spacing MM", "--slices LIST", "--volume NAME", "--filter NAME",
                   "--window WINDOW", "-q,--quiet"}},
+        HelpCase{"render",
+                 "INPUT... -o SHEET.png|SHEET.bmp\n",
+                 {"--series SERIES", "--phantom[=WxHxN]", "-o,--output FILE", "--size WxH",
+                  "--layout NAME", "--center X,Y,Z", "--no-annotations", "--line X,Y,X,Y",
+                  "--region X,Y,X,Y", "--window WINDOW", "--gamma G", "-q,--quiet"}},
         HelpCase{"select",
                  "INPUT... -o LIST.bdf\n",
                  {"--by NAME", "--limit N|P%", "-o,--output LIST.bdf", "--draw FILE",
@@ -125,12 +130,12 @@ INSTANTIATE_TEST_SUITE_P(
     testing::Values(
         UsageCase{"NoCommand",
                   {},
-                  "no command is named; there are info, mpr, mip, project, select, convert, "
-                  "phantom, bmp"},
+                  "no command is named; there are info, mpr, mip, project, render, select, "
+                  "convert, phantom, bmp"},
         UsageCase{"UnknownCommand",
                   {"show", "x"},
-                  "there is no command 'show'; there are info, mpr, mip, project, select, convert, "
-                  "phantom, bmp"},
+                  "there is no command 'show'; there are info, mpr, mip, project, render, select, "
+                  "convert, phantom, bmp"},
         UsageCase{"OptionInsteadOfCommand",
                   {"--fast"},
                   "the following argument was not expected: --fast"},

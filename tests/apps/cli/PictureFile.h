@@ -4,6 +4,7 @@
 /// @file
 /// Reading pictures with other code than that which writes them.
 
+#include <cstddef>
 #include <filesystem>
 #include <vector>
 
@@ -29,6 +30,24 @@ Picture ReadPng(const std::filesystem::path& path);
 /// Reads an uncompressed 8-bit BMP byte by byte, through its palette, which must be grey. Throws
 /// when it is anything else.
 Picture ReadBmp(const std::filesystem::path& path);
+
+/// Colours 0xRRGGBB, top row first.
+struct ColourPicture {
+  int width = 0;
+  int height = 0;
+  std::vector<unsigned> colours;
+
+  unsigned At(int x, int y) const {
+    return colours.at(static_cast<std::size_t>(y) * static_cast<std::size_t>(width) +
+                      static_cast<std::size_t>(x));
+  }
+};
+
+/// Reads an 8-bit colour PNG with the PNG library. Throws when it is anything else.
+ColourPicture ReadColourPng(const std::filesystem::path& path);
+
+/// Reads an uncompressed 24-bit BMP byte by byte. Throws when it is anything else.
+ColourPicture ReadColourBmp(const std::filesystem::path& path);
 
 }  // namespace cli_test
 

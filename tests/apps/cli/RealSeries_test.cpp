@@ -3,6 +3,8 @@
 #include <study/StudyFile.h>
 
 #include <algorithm>
+#include <cmath>
+#include <cstdio>
 #include <map>
 
 #include <dcmtk/config/osconfig.h>
@@ -141,6 +143,36 @@ TEST_F(RealSeries, PicturesAreRightSideUp) {
   // The vault of the skull is closed above, its base is thick below.
   EXPECT_LT(coronal.Mean(90, 0, 140, 20), 5);
   EXPECT_GT(coronal.Mean(120, 195, 200, 212), 60);
+}
+
+TEST_F(RealSeries, ASheetMeasuresTheFilesSamples) {
+  const Outcome outcome =
+      RunTool({"render", Folder(), "--region", "-30,70,-15,85", "-o", PathOf("sheet.png")});
+  EXPECT_EQ(outcome.code, 0);
+  EXPECT_EQ(outcome.errors, "");
+  std::vector<double> values;
+  for (int j = 0; j < 512; ++j) {
+    for (int i = 0; i < 512; ++i) {
+      const double x = -115.5 + i * kSpacing;
+      const double y = -1.85 + j * kSpacing;
+      if (x > -30 && x < -15 && y > 70 && y < 85) {
+        values.push_back(m_volume.stored(i, j, 48) - 1024);
+      }
+    }
+  }
+  double mean = 0;
+  for (const double value : values) {
+    mean += value / static_cast<double>(values.size());
+  }
+  double variance = 0;
+  for (const double value : values) {
+    variance += (value - mean) * (value - mean) / static_cast<double>(values.size());
+  }
+  char text[200];
+  std::snprintf(text, sizeof text,
+                "Voxels:       %d\nMean:         %.1f HU\nSD:           %.1f HU\n",
+                static_cast<int>(values.size()), mean, std::sqrt(variance));
+  EXPECT_NE(outcome.output.find(text), std::string::npos) << text << outcome.output;
 }
 
 TEST_F(RealSeries, ConvertedItHoldsTheFilesSamplesBitForBit) {

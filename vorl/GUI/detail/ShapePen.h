@@ -4,9 +4,13 @@
 /// @file
 /// What the shapes draw with.
 
+#include <vorl/GUI/Geom2D.h>
 #include <vorl/GUI/VGObjectView.h>
 #include <vorl/GUI/detail/DeviceRect.h>
 #include <vorl/GUI/detail/Truncated.h>
+
+#include <algorithm>
+#include <cmath>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -14,6 +18,20 @@ namespace vorl_detail {
 /// The width of the pen that draws the handles of a line.
 inline int HandleWidth(int thickness) {
   return ToDevice(std::int64_t{thickness} * 2 + 3);
+}
+
+/// Another point of the infinite line through a position, at least as far away as a screen is wide
+/// and as the origin is: one close by would lose the direction when it is rounded to single
+/// precision. A power of two keeps the ratio of the components exactly.
+inline dVect2D FarPoint(const dVect2D& pos, const dVect2D& direction) {
+  const double length = direction.Length();
+  const double reach = std::max({2048.0, std::fabs(double{pos.x}), std::fabs(double{pos.y})});
+  const bool isRegular = std::isnormal(length) && std::isfinite(reach);
+  const int exponent = isRegular ? std::ilogb(reach) - std::ilogb(length) : 0;
+  dVect2D point;
+  point.Set(pos.x + std::ldexp(double{direction.x}, exponent),
+            pos.y + std::ldexp(double{direction.y}, exponent));
+  return point;
 }
 
 /// The raster operation of a device context while a shape is drawn.
@@ -25,6 +43,24 @@ class ShapeROP {
   ~ShapeROP() {
     if (m_old != 0) {
       SetROP2(m_dc, m_old);
+    }
+  }
+
+ private:
+  HDC m_dc;
+  int m_old;
+};
+
+/// Leaves the gaps of broken lines as they are, instead of filling them with the background colour
+/// of the device context.
+class TransparentGaps {
+ public:
+  explicit TransparentGaps(HDC dc) : m_dc(dc), m_old(SetBkMode(dc, TRANSPARENT)) {}
+  TransparentGaps(const TransparentGaps&) = delete;
+  TransparentGaps& operator=(const TransparentGaps&) = delete;
+  ~TransparentGaps() {
+    if (m_old != 0) {
+      SetBkMode(m_dc, m_old);
     }
   }
 
@@ -59,6 +95,14 @@ class ShapePen {
   void Line(const dVect2D& start, const dVect2D& end) const {
     Line(Truncated<int>(start.x), Truncated<int>(start.y), Truncated<int>(end.x),
          Truncated<int>(end.y));
+  }
+  /// The part of an infinite line that lies in a rectangle.
+  void LineThrough(const dVect2D& pos, const dVect2D& direction, const tagRECT& clip) const {
+    dVect2D start;
+    dVect2D end;
+    if (Geom2D::ClipLine(pos, FarPoint(pos, direction), clip, start, end)) {
+      Line(start, end);
+    }
   }
   /// A line without length, which the pen makes as large as it is wide.
   void Dot(int x, int y) const { Line(x, y, x, y); }

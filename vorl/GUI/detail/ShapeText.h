@@ -50,10 +50,11 @@ inline double AlignmentFactor(int bits) {
 }
 
 /// The box of a text as the context's font makes it: bits 0 and 1 of the alignment place it
-/// vertically, bits 2 and 3 horizontally.
-inline tagRECT TextBox(HDC dc, const char* text, const dVect2D& anchor, int alignment) {
+/// vertically, bits 2 and 3 horizontally. The format is the one it will be drawn with.
+inline tagRECT TextBox(HDC dc, const char* text, const dVect2D& anchor, int alignment,
+                       unsigned format = 0) {
   tagRECT size{0, 0, 0, 0};
-  DrawTextA(dc, text, -1, &size, DT_CALCRECT);
+  DrawTextA(dc, text, -1, &size, DT_CALCRECT | format);
   const double factorY = AlignmentFactor(alignment);
   const double factorX = AlignmentFactor(static_cast<int>(static_cast<unsigned>(alignment) >> 2U));
   const int top = Truncated<int>(factorY * size.bottom + anchor.y);
