@@ -129,7 +129,8 @@ TEST_F(RenderTexts, TheFirstTickOfTheHistogramHasItsLabel) {
     ++tick;
   }
   ASSERT_LT(tick, panel.right);
-  EXPECT_GT(Count(sheet, {tick - 10, axis + 11, tick + 11, axis + 28}, kTextColour), 5);
+  const Frame label{tick - 10, axis + 11, tick + 11, axis + 28};
+  EXPECT_GT(21 * 17 - Count(sheet, label, kSheetColour), 30);
 }
 
 /// The pixels above a picture, where its name and its window stand.
