@@ -43,6 +43,7 @@ int main() {
   rect.SetData(corners);
   rect.Enable(VGOperation_All);
   rect.SetViewState(VGViewState_Visible);
+  rect.SetPenColor(RGB(255, 255, 255));
 
   Listener listener;
   GraphicHandler layer;

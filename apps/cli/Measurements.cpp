@@ -5,11 +5,13 @@
 #include <cli/Values.h>
 #include <vorl/GUI/VGLine.h>
 
+#include <algorithm>
+
 namespace cli {
 namespace {
 
-std::string Fixed(double value, const std::string& unit) {
-  std::string text = FixedText(value, 1);
+std::string Fixed(double value, int decimals, const std::string& unit) {
+  std::string text = FixedText(value, decimals);
   return unit.empty() ? text : text.append(" ").append(unit);
 }
 
@@ -38,8 +40,12 @@ Measured Measure(study::Study& study, const MeasureRequest& request, ResultTable
       measured.region = tissue.EvenRect(cursor, measured.line);
     }
   }
+  // Tenths, or more decimals where voxels or the steps between values are smaller than that.
+  const PixelGrid grid(*cut);
+  const int lengths = std::max(1, DecimalsFor(std::min(grid.spacing, grid.spacingDown)));
+  const int values = DecimalsFor(study.scale) + 1;
   if (measured.line) {
-    measured.lineText = Fixed(LengthOf(*measured.line), "mm");
+    measured.lineText = Fixed(LengthOf(*measured.line), lengths, "mm");
     results.emplace_back("Line", measured.lineText);
   }
   if (!measured.region) {
@@ -47,17 +53,18 @@ Measured Measure(study::Study& study, const MeasureRequest& request, ResultTable
   }
   const PlaneRect& region = *measured.region;
   const Statistics statistics = StatisticsOf(*cut, region);
-  results.emplace_back("Region", Fixed(region.right - region.left, {}) + " x " +
-                                     Fixed(region.bottom - region.top, "mm"));
+  results.emplace_back("Region", Fixed(region.right - region.left, lengths, {}) + " x " +
+                                     Fixed(region.bottom - region.top, lengths, "mm"));
   results.emplace_back("Voxels", std::to_string(statistics.count));
   if (statistics.count > 0) {
-    results.emplace_back("Mean", Fixed(statistics.mean, study.unit));
-    results.emplace_back("SD", Fixed(statistics.deviation, study.unit));
+    const std::string mean = Fixed(statistics.mean, values, study.unit);
+    const std::string deviation = Fixed(statistics.deviation, values, study.unit);
+    results.emplace_back("Mean", mean);
+    results.emplace_back("SD", deviation);
     results.emplace_back("Range", NumberText(statistics.minimum) + " to " +
                                       NumberText(statistics.maximum) +
                                       (study.unit.empty() ? "" : " ") + study.unit);
-    measured.regionText = "Mean " + Fixed(statistics.mean, study.unit) + "\nSD " +
-                          Fixed(statistics.deviation, study.unit);
+    measured.regionText = "Mean " + mean + "\nSD " + deviation;
   }
   return measured;
 }

@@ -69,17 +69,20 @@ std::unique_ptr<study::Study> Resample(study::Study& cut, const PixelRaster& ras
   const auto padded = Padded(cut);
   const dCoordSys3D& source = padded->volume.GetCoordinates();
   const PlaneFrame frame(source);
+  // Planes have no depth. Tiny pixels are given one with which they can be placed.
+  constexpr double kLeastVolume = 1e-5;
+  const double least = std::min(raster.spacing, Length(ToVec3(source.axisY)));
+  const dVect3D depth =
+      ToVect(frame.normal * std::max(Length(ToVec3(source.axisZ)), kLeastVolume / (least * least)));
   dCoordSys3D place;
   place.Set(ToVect(moved(FirstPixel(source), frame.right, raster.left + first)),
-            ToVect(frame.right * raster.spacing), ToVect(ToVec3(source.axisY) * kWholeStep),
-            source.axisZ);
+            ToVect(frame.right * raster.spacing), ToVect(ToVec3(source.axisY) * kWholeStep), depth);
   const auto wide =
       Sample(*padded, place, raster.width, static_cast<int>(padded->volume.GetSizeY()),
              study::PartOf(progress, 0, 0.5));
   const dCoordSys3D& between = wide->volume.GetCoordinates();
   place.Set(ToVect(moved(FirstPixel(between), frame.down, raster.top + first)),
-            ToVect(ToVec3(between.axisX) * kWholeStep), ToVect(frame.down * raster.spacing),
-            between.axisZ);
+            ToVect(ToVec3(between.axisX) * kWholeStep), ToVect(frame.down * raster.spacing), depth);
   return Sample(*wide, place, raster.width, raster.height, study::PartOf(progress, 0.5, 1));
 }
 

@@ -7,13 +7,11 @@
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 
 namespace cli {
 namespace {
 
-constexpr int kTicks = 8 + 2 + 4;  ///< of a ruler, and gaps
-constexpr double kLabelsAcross = 10;
+constexpr int kTicks = 8 + 2 + 4;        ///< of a ruler, and gaps
 constexpr double kHistogramShape = 1.6;  ///< height by width, at most
 constexpr double kTableShare = 0.3;      ///< of a panel that lies below
 constexpr int kTableLine = 4;            ///< thirds of the text's height
@@ -24,34 +22,43 @@ Contents ContentsOf(const SheetContent& sheet) {
   using study::Plane;
   Display projection = sheet.display;
   projection.window = sheet.projectionWindow;
-  return {{{"Axial", Plane::Axial, false, sheet.display, sheet.cursor, colour::kAxial,
+  return {{{"Axial", "Axial", Plane::Axial, false, sheet.display, sheet.cursor, colour::kAxial,
             colour::kCoronal, colour::kSagittal},
-           {"Maximum intensity", Plane::Coronal, true, projection, sheet.cursor, colour::kQuiet,
-            colour::kAxial, colour::kSagittal},
-           {"Coronal", Plane::Coronal, false, sheet.display, sheet.cursor, colour::kCoronal,
-            colour::kAxial, colour::kSagittal},
-           {"Sagittal", Plane::Sagittal, false, sheet.display, sheet.cursor, colour::kSagittal,
-            colour::kAxial, colour::kCoronal}}};
+           {"Maximum intensity", "MIP", Plane::Coronal, true, projection, sheet.cursor,
+            colour::kQuiet, colour::kAxial, colour::kSagittal},
+           {"Coronal", "Coronal", Plane::Coronal, false, sheet.display, sheet.cursor,
+            colour::kCoronal, colour::kAxial, colour::kSagittal},
+           {"Sagittal", "Sagittal", Plane::Sagittal, false, sheet.display, sheet.cursor,
+            colour::kSagittal, colour::kAxial, colour::kCoronal}}};
 }
 
-/// What the widest label of a vertical ruler takes.
-int LabelWidth(const study::Study& study, const SheetCanvas& canvas) {
+/// What the labels of the vertical rulers of a plan take. Between the ends of a ruler none is wider
+/// than there.
+int LabelWidth(const study::Study& study, const Contents& views, const SheetPlan& plan,
+               const SheetCanvas& canvas) {
   int width = 0;
-  for (const study::Vec3& axis : {study::Vec3{0, 1, 0}, study::Vec3{0, 0, 1}}) {
-    const study::Extent extent = study::ExtentAlong(study, axis);
-    const double step = (extent.maximum - extent.minimum) / kLabelsAcross;
-    const int decimals = std::clamp(static_cast<int>(std::ceil(-std::log10(step))), 0, 6);
-    for (const double value : {extent.minimum, extent.maximum}) {
-      char text[64];
-      std::snprintf(text, sizeof text, "%.*f", decimals, value);
-      width = std::max(width, canvas.SizeOf(text).width);
+  for (std::size_t i = 0; i < kViewCount; ++i) {
+    const double scale = plan.mmPerPixel[i];
+    const tagRECT picture = WithoutMargins(plan.views[i], plan.margins);
+    const double half = 0.5 * static_cast<double>(picture.bottom - picture.top) * scale;
+    // The ticks are at least so far from each other.
+    const double step = kLinesPerTick * canvas.GetLineHeight() * scale;
+    const double middle = MiddleDown(study, views[i].plane);
+    // Labels of one digit get a decimal.
+    const int decimals = DecimalsFor(step) + (std::abs(middle) + half < 10 ? 1 : 0);
+    for (const double value : {middle - half, middle + half}) {
+      width = std::max(width, canvas.SizeOf(FixedText(value, decimals)).width);
     }
   }
   return width;
 }
 
+/// Labels depend on the scale, and the scale on the room that labels take: a plan whose labels turn
+/// out wider is made again.
 SheetPlan MakePlan(const study::Study& study, const SheetContent& content, const Contents& views,
                    const SheetCanvas& canvas) {
+  constexpr int kTrials = 5;
+  const int ticks = kTicks + canvas.GetPenWidth();
   SheetRequest request;
   request.width = content.width;
   request.height = content.height;
@@ -59,12 +66,21 @@ SheetPlan MakePlan(const study::Study& study, const SheetContent& content, const
   request.isAnnotated = content.isAnnotated;
   request.lineHeight = canvas.GetLineHeight();
   request.penWidth = canvas.GetPenWidth();
-  request.rulerWidth = LabelWidth(study, canvas) + kTicks;
-  request.rulerHeight = canvas.GetLineHeight() + kTicks;
+  request.rulerWidth = ticks;
+  request.rulerHeight = canvas.GetLineHeight() + ticks;
   for (std::size_t i = 0; i < kViewCount; ++i) {
     request.extents[i] = ExtentOf(study, views[i].plane);
   }
-  return PlanSheet(request);
+  SheetPlan plan = PlanSheet(request);
+  for (int trial = 0; trial < kTrials && plan.hasRulers; ++trial) {
+    const int needed = LabelWidth(study, views, plan, canvas) + ticks;
+    if (needed <= request.rulerWidth) {
+      break;
+    }
+    request.rulerWidth = needed;
+    plan = PlanSheet(request);
+  }
+  return plan;
 }
 
 void DrawBackground(const SheetContent& content, const SheetCanvas& canvas) {
@@ -93,7 +109,8 @@ void DrawHeader(const study::Study& study, const SheetCanvas& canvas, const tagR
   texts.Draw();
 }
 
-/// Rows as far as they fit, names at the left, values at the right.
+/// Rows as far as they fit, names at the left, values at the right, or below where both together
+/// are too wide.
 void DrawTable(const ResultTable& results, const SheetCanvas& canvas, const tagRECT& rect) {
   TextLayer texts(canvas, rect);
   const int left = static_cast<int>(rect.left);
@@ -102,8 +119,12 @@ void DrawTable(const ResultTable& results, const SheetCanvas& canvas, const tagR
   texts.Write("Measurements", left, y, {colour::kStrong, true, false});
   for (const auto& [name, value] : results) {
     y += canvas.GetLineHeight() * kTableLine / 3;
-    if (texts.WriteBefore(value, right, y, {})) {
-      texts.Write(name, left, y, {colour::kQuiet, false, false});
+    if (!texts.Write(name, left, y, {colour::kQuiet, false, false})) {
+      break;
+    }
+    if (!texts.WriteBefore(value, right, y, {})) {
+      y += canvas.GetLineHeight();
+      texts.WriteBefore(value, right, y, {});
     }
   }
   texts.Draw();

@@ -32,6 +32,7 @@ SheetCanvas::SheetCanvas(int width, int height)
     throw study::Error("there is not enough memory for a sheet of " + std::to_string(width) +
                        " x " + std::to_string(height) + " pixels");
   }
+  SetBkMode(m_dc, TRANSPARENT);  // what lies below shows in the gaps of dotted lines
   m_lineHeight = std::max(1, SizeOf("Mg").height);
 }
 

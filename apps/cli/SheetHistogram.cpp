@@ -1,4 +1,5 @@
 #include <cli/SheetHistogram.h>
+#include <cli/Values.h>
 #include <vorl/GUI/VGAxis.h>
 #include <vorl/GUI/VGCurve.h>
 #include <vorl/GUI/VGLine.h>
@@ -14,6 +15,8 @@ namespace {
 
 constexpr double kTail = 1e-5;
 constexpr double kMargin = 0.02;         ///< of the values, at both ends
+constexpr double kLeastTicks = 5;        ///< of the axis
+constexpr double kMostMargin = 0.15;     ///< of the axis
 constexpr double kAir = 1.06;            ///< the upper end, in heights of the curve
 constexpr int kRulerLength = 8 + 2 + 3;  ///< ticks and gaps
 constexpr int kWidestLabels = 4;         ///< in lines, from label to label
@@ -70,9 +73,7 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
       m_title(canvas, {rect.left, rect.top, rect.right, rect.top + canvas.GetLineHeight() + 1}) {
   const Histogram counts = HistogramOf(study);
   FindEnds(counts, m_first, m_last);
-  const double margin = std::max(0.5, kMargin * (m_last - m_first));
-  m_first -= margin;
-  m_last += margin;
+  AddMargins(study);
   PlaceViewPort();
   AddCurve(counts);
   AddFrame();
@@ -83,6 +84,22 @@ SheetHistogram::SheetHistogram(const study::Study& study, const RealWindow& wind
                 {colour::kStrong, true, false});
   m_title.WriteBefore("voxels, logarithmic", static_cast<int>(rect.right),
                       static_cast<int>(rect.top), {colour::kQuiet, false, false});
+}
+
+// The label of a value at either end must fit, too.
+void SheetHistogram::AddMargins(const study::Study& study) {
+  const double values = m_last - m_first;
+  const int columns = std::max(1, static_cast<int>(m_rect.right - m_rect.left));
+  const int decimals = DecimalsFor(values * study.scale / kLeastTicks);
+  int label = 0;
+  for (const double value : {m_first, m_last}) {
+    const std::string text = FixedText(study.RealValue(value), decimals);
+    label = std::max(label, m_canvas.SizeOf(text).width);
+  }
+  const double share = std::min(kMostMargin, 0.5 * (label + 4 * m_canvas.GetPenWidth()) / columns);
+  const double margin = std::max({0.5, kMargin * values, values * share / (1 - 2 * share)});
+  m_first -= margin;
+  m_last += margin;
 }
 
 void SheetHistogram::PlaceViewPort() {

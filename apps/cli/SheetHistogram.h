@@ -28,6 +28,7 @@ class SheetHistogram {
   void Draw();
 
  private:
+  void AddMargins(const study::Study& study);
   void PlaceViewPort();
   void AddCurve(const Histogram& counts);
   void AddFrame();

@@ -20,7 +20,7 @@ namespace {
 /// So much of a pixel the image is moved to the right and down: its edges are meant to lie on those
 /// of pixels, and must not be cut down to the ones before.
 constexpr double kHair = 0.02;
-constexpr int kLinesPerTick = 4;
+constexpr double kNarrowWindow = 5;  ///< in which tenths are not enough
 
 study::PlaneGeometry OnePixel(const study::Study& study, study::Plane plane) {
   study::PlaneRequest request;
@@ -34,6 +34,15 @@ double SignOf(const study::Vec3& direction) {
   return direction.x + direction.y + direction.z < 0 ? -1 : 1;
 }
 
+/// With tenths, or as many decimals as tell where a narrow window ends.
+std::string WindowText(const RealWindow& window, const std::string& unit) {
+  const int decimals = window.width < kNarrowWindow ? DecimalsFor(window.width) + 2 : 1;
+  const double power = std::pow(10, decimals);
+  const auto text = [power](double value) { return NumberText(std::round(value * power) / power); };
+  std::string line = "C " + text(window.centre) + "  W " + text(window.width);
+  return unit.empty() ? line : line.append("  ").append(unit);
+}
+
 }  // namespace
 
 ViewExtent ExtentOf(const study::Study& study, study::Plane plane) {
@@ -41,6 +50,12 @@ ViewExtent ExtentOf(const study::Study& study, study::Plane plane) {
   const study::Extent x = study::ExtentAlong(study, frame.right);
   const study::Extent y = study::ExtentAlong(study, frame.down);
   return {x.maximum - x.minimum, y.maximum - y.minimum};
+}
+
+double MiddleDown(const study::Study& study, study::Plane plane) {
+  const PlaneFrame frame(OnePixel(study, plane).coordinates);
+  const study::Extent y = study::ExtentAlong(study, frame.down);
+  return 0.5 * (y.minimum + y.maximum) * SignOf(frame.down);
 }
 
 SheetView::SheetView(study::Study& study, const SheetCanvas& canvas, const ViewContent& content,
@@ -190,27 +205,27 @@ void SheetView::AddLetters() {
   write(m_frame.down, 0.5, 1);
 }
 
-// Of the name, as much as there is room for.
+// The window goes before a long name, and that before the position.
 void SheetView::AddTitle(const study::Study& study) {
   const int y = static_cast<int>(m_place.rect.top);
   const TextLook nameLook{m_content.colour, true, false};
   const int left = static_cast<int>(m_picture.left);
-  if (!m_title.Write(m_content.name, left, y, nameLook)) {
+  const std::string window = WindowText(m_content.display.window, study.unit);
+  const int gap = m_canvas.GetLineHeight() / 2;
+  const int room =
+      static_cast<int>(m_picture.right - m_picture.left) - m_canvas.SizeOf(window).width - gap;
+  const bool isShort = m_canvas.SizeOf(m_content.name, true).width > room;
+  const std::string& name = isShort ? m_content.shortName : m_content.name;
+  if (!m_title.Write(name, left, y, nameLook)) {
     return;
   }
-  const RealWindow& window = m_content.display.window;
-  char text[96];
-  std::snprintf(text, sizeof text, "C %s  W %s%s%s",
-                NumberText(std::round(window.centre * 10) / 10).c_str(),
-                NumberText(std::round(window.width * 10) / 10).c_str(),
-                study.unit.empty() ? "" : "  ", study.unit.c_str());
-  m_title.WriteBefore(text, static_cast<int>(m_picture.right), y, {});
+  m_title.WriteBefore(window, static_cast<int>(m_picture.right), y, {});
   if (!m_content.isProjection) {
     const char axis = "zyx"[static_cast<int>(m_content.plane)];
     const double position = Dot(m_content.cursor, m_frame.normal) * SignOf(m_frame.normal);
+    char text[96];
     std::snprintf(text, sizeof text, "%c = %s mm", axis, FixedText(position, 1).c_str());
-    const int gap = m_canvas.GetLineHeight() / 2;
-    m_title.Write(text, left + m_canvas.SizeOf(m_content.name, true).width + gap, y, {});
+    m_title.Write(text, left + m_canvas.SizeOf(name, true).width + gap, y, {});
   }
 }
 

@@ -23,7 +23,8 @@ namespace cli {
 
 /// What a view shows.
 struct ViewContent {
-  std::string name;  ///< such as "Axial"
+  std::string name;       ///< such as "Axial"
+  std::string shortName;  ///< where there is no room for that
   study::Plane plane = study::Plane::Axial;
   bool isProjection = false;  ///< of the whole volume's brightest voxels, instead of a cut
   Display display;
@@ -94,8 +95,13 @@ class SheetView {
   TextLayer m_texts, m_title;
 };
 
+/// How far the ticks of a ruler are from each other at least, in lines of text.
+inline constexpr int kLinesPerTick = 4;
+
 /// What a view must show of a study for all of it to be seen.
 ViewExtent ExtentOf(const study::Study& study, study::Plane plane);
+/// The patient's coordinate in the middle of the view, from top to bottom.
+double MiddleDown(const study::Study& study, study::Plane plane);
 
 }  // namespace cli
 

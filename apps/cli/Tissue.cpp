@@ -14,7 +14,8 @@ constexpr double kRectShape = 0.75;  ///< height by width
 constexpr double kDistance = 0.02;   ///< from the lines, of the body's width
 constexpr double kSmaller = 0.75;
 constexpr double kEven = 0.01;    ///< deviation by contrast, from which on a rectangle is even
-constexpr int kSmallestRect = 3;  ///< pixels
+constexpr int kSmallestRect = 3;  ///< cells
+constexpr int kMostCells = 1024;  ///< in each direction
 
 }  // namespace
 
@@ -26,12 +27,11 @@ class Tissue::Sums {
       : m_columns(tissue.m_grid.width + 1),
         m_sums(static_cast<std::size_t>(m_columns) *
                static_cast<std::size_t>(tissue.m_grid.height + 1)) {
-    const auto samples = study::SamplesOf(tissue.m_cut.volume.GetSliceList().front());
     for (int j = 0; j < tissue.m_grid.height; ++j) {
       Sum row;
       for (int i = 0; i < tissue.m_grid.width; ++i) {
         const std::size_t at = tissue.At(i, j);
-        const double value = tissue.m_bright[at] != 0 ? samples[at] : 0;
+        const double value = tissue.m_bright[at] != 0 ? tissue.m_samples[at] : 0;
         row += {static_cast<double>(tissue.m_bright[at]), value, value * value};
         m_sums[At(i + 1, j + 1)] = m_sums[At(i + 1, j)];
         m_sums[At(i + 1, j + 1)] += row;
@@ -80,17 +80,39 @@ class Tissue::Sums {
   std::vector<Sum> m_sums;
 };
 
-Tissue::Tissue(const study::Study& cut) : m_cut(cut), m_grid(cut) {
+Tissue::Tissue(const study::Study& cut) : m_cut(cut), m_pixels(cut), m_grid(m_pixels) {
+  TakeSamples();
   MarkBright();
   FindBody();
 }
 
+// What is left over at the right and lower edges, less than a cell, is not searched.
+void Tissue::TakeSamples() {
+  const auto pixelsPerCell = [](int pixels) { return (pixels + kMostCells - 1) / kMostCells; };
+  m_columns = pixelsPerCell(m_pixels.width);
+  m_rows = pixelsPerCell(m_pixels.height);
+  m_grid.spacing *= m_columns;
+  m_grid.spacingDown *= m_rows;
+  m_grid.width /= m_columns;
+  m_grid.height /= m_rows;
+  const auto samples = study::SamplesOf(m_cut.volume.GetSliceList().front());
+  m_samples.reserve(At(0, m_grid.height));
+  for (int j = 0; j < m_grid.height; ++j) {
+    const std::size_t row =
+        static_cast<std::size_t>(MiddleRow(j)) * static_cast<std::size_t>(m_pixels.width);
+    for (int i = 0; i < m_grid.width; ++i) {
+      m_samples.push_back(samples[row + static_cast<std::size_t>(MiddleColumn(i))]);
+    }
+  }
+}
+
 void Tissue::MarkBright() {
-  const std::uint16_t dark = PartingValue(HistogramOf(m_cut));
+  m_dark = PartingValue(HistogramOf(m_cut));
   double sums[2] = {0, 0};
   double counts[2] = {0, 0};
-  for (const std::uint16_t sample : study::SamplesOf(m_cut.volume.GetSliceList().front())) {
-    const std::uint8_t isBright = sample > dark ? 1 : 0;
+  m_bright.reserve(m_samples.size());
+  for (const std::uint16_t sample : m_samples) {
+    const std::uint8_t isBright = sample > m_dark ? 1 : 0;
     m_bright.push_back(isBright);
     sums[isBright] += sample;
     counts[isBright] += 1;
@@ -177,9 +199,24 @@ std::optional<PlaneLine> Tissue::LineAcross(const PlanePoint& cursor) const {
   const auto behind =
       std::find(std::make_reverse_iterator(end), std::make_reverse_iterator(begin), 1).base() -
       begin;
-  const double y = m_grid.CentreY(row);
-  return PlaneLine{{m_grid.left + static_cast<double>(first) * m_grid.spacing, y},
-                   {m_grid.left + static_cast<double>(behind) * m_grid.spacing, y}};
+  // From the middles of the outermost cells on to the edges.
+  const auto samples = study::SamplesOf(m_cut.volume.GetSliceList().front())
+                           .subspan(static_cast<std::size_t>(MiddleRow(row)) *
+                                    static_cast<std::size_t>(m_pixels.width));
+  const auto isBright = [&](int column) {
+    return samples[static_cast<std::size_t>(column)] > m_dark;
+  };
+  int left = MiddleColumn(static_cast<int>(first));
+  int right = MiddleColumn(static_cast<int>(behind) - 1) + 1;
+  while (left > 0 && isBright(left - 1)) {
+    --left;
+  }
+  while (right < m_pixels.width && isBright(right)) {
+    ++right;
+  }
+  const double y = m_pixels.CentreY(MiddleRow(row));
+  return PlaneLine{{m_pixels.left + left * m_pixels.spacing, y},
+                   {m_pixels.left + right * m_pixels.spacing, y}};
 }
 
 Tissue::Candidate Tissue::MostEven(const Sums& sums, int width, int height,

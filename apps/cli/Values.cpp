@@ -153,6 +153,11 @@ std::string FixedText(double value, int decimals) {
   return isZero && text[0] == '-' ? text + 1 : text;
 }
 
+int DecimalsFor(double step) {
+  // A hair less, so that a thousandth has three decimals even if its logarithm is rounded.
+  return static_cast<int>(std::clamp(std::ceil(-std::log10(step) - 1e-6), 0.0, 9.0));
+}
+
 std::string LengthText(double value) {
   const auto single = static_cast<float>(value);
   char text[64];

@@ -50,6 +50,10 @@ std::string PositionText(double millimetres);
 /// A number with so many decimals, and never a negative zero.
 std::string FixedText(double value, int decimals);
 
+/// The decimals that tell numbers apart whose distance is `step`, which is greater than 0: 0 from
+/// whole numbers on, 9 at most.
+int DecimalsFor(double step);
+
 /// A length that was kept in single precision: "0.7" rather than "0.699999988", but all nine
 /// digits of 0.451171875, which single precision holds exactly.
 std::string LengthText(double value);

@@ -115,7 +115,11 @@ RealWindow ProjectionWindow(study::Study& study) {
   const double bright = std::accumulate(middle, counts.end(), 0.0);
   const double black = static_cast<double>(middle - counts.begin()) +
                        static_cast<double>(PassTail(middle, counts.end(), 0.5 * bright));
-  const double width = std::max((fromTop(kProjectionTail) - black) * kProjectionHeadroom, 2.0);
+  const double brightest = fromTop(kProjectionTail);
+  if (brightest <= black) {  // half of the bright voxels are as bright
+    return AutoWindow(study);
+  }
+  const double width = std::max((brightest - black) * kProjectionHeadroom, 2.0);
   return {study.RealValue(black + 0.5 * width), width * study.scale};
 }
 

@@ -41,7 +41,8 @@ RealWindow AutoWindow(study::Study& study);
 /// The same for pictures of the brightest voxels, in which nearly every ray meets soft tissue:
 /// black up to the middle value of all that is not background, white a tenth above the value that
 /// one voxel in 10,000 lies above. What is bright in a few places only, such as bones, stands out;
-/// a few specks of metal do not make the rest dark.
+/// a few specks of metal do not make the rest dark. Where most of what is bright is the brightest
+/// there is, all of it would be black: that is shown with `AutoWindow`.
 RealWindow ProjectionWindow(study::Study& study);
 
 /// For a picture of single things on black (samples of 0): what is drawn reaches from dark grey to

@@ -153,6 +153,24 @@ TEST_F(RenderMeasure, WhereThereIsNoBodyNothingIsMeasured) {
   EXPECT_EQ(m_results, (Results{{"Planes", "5.0, 5.0, 5.0 mm"}}));
 }
 
+TEST_F(RenderMeasure, InLargeSlicesTheBodyIsMeasuredToThePixel) {
+  VolumeModel large;  // a body of 1501 x 901 pixels that is noisy but for a part of it
+  large.size = {2503, 1301, 1};
+  large.step = {Point{0.2, 0, 0}, Point{0, 0.2, 0}, Point{0, 0, 1}};
+  large.stored = [](int i, int j, int) {
+    if (i < 501 || i > 2001 || j < 200 || j > 1100) {
+      return 0;
+    }
+    return i >= 1400 && i < 1900 && j >= 700 && j < 1050 ? 1500 : 1200 + 300 * ((i + j) / 5 % 2);
+  };
+  WriteVolume(large, PathOf("large.bdf"));
+  Sheet("large.bdf");
+  EXPECT_EQ(m_results["Line"], "300.2 mm");
+  EXPECT_EQ(m_results["Mean"], "500.0 HU");
+  EXPECT_EQ(m_results["SD"], "0.0 HU");
+  EXPECT_GT(std::stoi(m_results["Voxels"]), 10000);
+}
+
 TEST_F(RenderMeasure, WithoutAnnotationsNothingIsMeasured) {
   BoxSheet({"--no-annotations"});
   EXPECT_EQ(m_results, Results{});

@@ -300,6 +300,22 @@ TEST_F(RenderPictures, GreyLevelsFollowTheWindow) {
   }
 }
 
+TEST_F(RenderPictures, TheBrightestVoxelsAreNotBlackEvenIfManyAreAsBright) {
+  const ColourPicture sheet = Sheet("box.bdf");
+  const Frame frame = FindFrames(sheet).projection;
+  EXPECT_TRUE(
+      IsBright(sheet.At((frame.left + frame.right) / 2 - 9, (frame.top + frame.bottom) / 2 + 9)));
+  VolumeModel even;
+  even.size = {10, 10, 10};
+  even.step = {Point{1, 0, 0}, Point{0, 1, 0}, Point{0, 0, 1}};
+  even.stored = [](int, int, int) { return 1500; };
+  WriteVolume(even, PathOf("even.bdf"));
+  const ColourPicture grey = Sheet("even.bdf");
+  const Frame picture = FindFrames(grey).projection;
+  EXPECT_TRUE(IsBright(
+      grey.At((picture.left + picture.right) / 2 - 20, (picture.top + picture.bottom) / 2 + 20)));
+}
+
 /// The pixels above a picture, where its name and its window stand.
 std::vector<unsigned> Title(const ColourPicture& sheet, const Frame& frame) {
   std::vector<unsigned> pixels;
