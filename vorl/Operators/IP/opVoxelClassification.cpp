@@ -302,10 +302,10 @@ bool opVoxelClassification::SelectVoxels() {
 template <class T>
 bool opVoxelClassification::Count(int algo, const dVolume& source, const dVOI* region,
                                   std::uint32_t* counters) {
-  vorl_detail::ValueCounter counter;
   const auto count = [&](auto classOf, auto countedAs, vorl_detail::EdgeClassRun* edgeClasses) {
     using Class = decltype(classOf);
     const vorl_detail::VoxelBox box(source, region, Class::kNeighbours);
+    vorl_detail::ValueCounter counter(box.Count());
     ClassRow classes(edgeClasses, box);
     const auto visit = [&](const vorl_detail::VoxelRow<T>& row) {
       if (counter.IsValid()) {

@@ -101,7 +101,7 @@ TEST_P(VoxelRuns, SelectionListsTheColumnsInOrderAsFarAsThereIsRoom) {
 }
 
 void ExpectCounted(const std::vector<std::vector<std::uint16_t>>& runs) {
-  ValueCounter counter;
+  ValueCounter counter(1000000);
   ASSERT_TRUE(counter.IsValid());
   std::map<int, std::uint32_t> expected;
   for (const auto& run : runs) {
@@ -113,6 +113,12 @@ void ExpectCounted(const std::vector<std::vector<std::uint16_t>>& runs) {
   std::map<int, std::uint32_t> counted;
   counter.ForEach([&](std::uint16_t value, std::uint32_t times) { counted[value] = times; });
   EXPECT_EQ(counted, expected);
+}
+
+TEST(ValueCounter, FewValuesAreNotWorthItsCounts) {
+  EXPECT_FALSE(ValueCounter(0).IsValid());
+  EXPECT_FALSE(ValueCounter(131071).IsValid());
+  EXPECT_TRUE(ValueCounter(131072).IsValid());
 }
 
 TEST(ValueCounter, CountsRunsOfEveryLength) {

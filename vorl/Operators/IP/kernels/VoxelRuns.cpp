@@ -69,7 +69,9 @@ const VoxelKernels& ActiveVoxelKernels() {
   return active;
 }
 
-ValueCounter::ValueCounter() : m_counts(new (std::nothrow) std::uint32_t[2 * kValues]()) {}
+ValueCounter::ValueCounter(std::uint64_t expected)
+    : m_counts(expected < kWorthwhile ? nullptr : new (std::nothrow) std::uint32_t[2 * kValues]()) {
+}
 
 // Rows follow one another in memory, and counting is fast enough to wait for it: asking 2 KB ahead
 // takes 2.46 instead of 2.08 thousand million samples per second. Past the end nothing is read.

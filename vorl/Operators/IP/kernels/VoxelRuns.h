@@ -56,8 +56,9 @@ const VoxelKernels& ActiveVoxelKernels();
 /// not wait for the count of an equal one before it; sixteen equal neighbours are counted at once.
 class ValueCounter {
  public:
-  /// Without memory for the counts the counter is not valid and must not be used.
-  ValueCounter();
+  /// For about so many values. For fewer than make up for clearing the counts and adding them up,
+  /// and without memory for them, the counter is not valid and must not be used.
+  explicit ValueCounter(std::uint64_t expected);
   bool IsValid() const { return m_counts != nullptr; }
 
   void Count(const std::uint16_t* values, std::size_t count);
@@ -75,6 +76,7 @@ class ValueCounter {
 
  private:
   static constexpr std::size_t kValues = 65536;
+  static constexpr std::uint64_t kWorthwhile = 131072;
 
   std::unique_ptr<std::uint32_t[]> m_counts;
 };
