@@ -1,12 +1,11 @@
 #include <vorl/Data/dDIB.h>
 #include <vorl/IO/File/opDIB2Ima.h>
 
-#include <filesystem>
-#include <random>
-#include <string>
-#include <system_error>
+#include <cstdio>
+#include <memory>
 
 #include "../Fixtures.h"
+#include "../ScratchFile.h"
 
 namespace {
 
@@ -15,26 +14,6 @@ constexpr unsigned long kEdge = 2048;
 long Edge() {
   return static_cast<long>(bench::Shrunk(kEdge));
 }
-
-/// The name of a file that no other run uses; what is written there is removed at the end.
-class ScratchFile {
- public:
-  ScratchFile()
-      : m_path((std::filesystem::temp_directory_path() /
-                (std::string("vorl_bench_") + std::to_string(std::random_device()()) + ".bmp"))
-                   .string()) {}
-  ScratchFile(const ScratchFile&) = delete;
-  ScratchFile& operator=(const ScratchFile&) = delete;
-  ~ScratchFile() {
-    std::error_code ignored;
-    std::filesystem::remove(m_path, ignored);
-  }
-
-  const char* Name() const { return m_path.c_str(); }
-
- private:
-  std::string m_path;
-};
 
 void ReportPixels(benchmark::State& state, const dImage& image) {
   bench::Report(state, image.GetWidth() * image.GetHeight(), image.GetImageSize());
@@ -62,7 +41,7 @@ void CreateSmall(benchmark::State& state) {
 }
 
 void Save(benchmark::State& state) {
-  const ScratchFile file;
+  const bench::ScratchFile file(".bmp");
   dDIB dib(Edge(), Edge(), 3, 8);
   bench::Fill(dib);
   for (auto _ : state) {
@@ -76,7 +55,7 @@ void Save(benchmark::State& state) {
 
 // `target` is formatted once: later loads reuse its pixels if it is a plain image.
 void Load(benchmark::State& state, dImage& target, short channels) {
-  const ScratchFile file;
+  const bench::ScratchFile file(".bmp");
   dDIB dib(Edge(), Edge(), channels, 8);
   bench::Fill(dib);
   dib.Save(file.Name(), true);
@@ -106,6 +85,56 @@ void LoadBitmap24(benchmark::State& state) {
   Load(state, bitmap, 3);
 }
 
+// The class's own reader, into a new section each time.
+void Open(benchmark::State& state) {
+  const bench::ScratchFile file(".bmp");
+  dDIB dib(Edge(), Edge(), 3, 8);
+  bench::Fill(dib);
+  dib.Save(file.Name(), true);
+  dDIB opened;
+  for (auto _ : state) {
+    if (!opened.Init(file.Name())) {
+      state.SkipWithError(static_cast<const char*>(opened.GetStatus()));
+      return;
+    }
+    benchmark::ClobberMemory();
+  }
+  ReportPixels(state, opened);
+}
+
+// As many bytes without the format: what the file system takes.
+void WriteRaw(benchmark::State& state) {
+  const bench::ScratchFile file(".raw");
+  dDIB dib(Edge(), Edge(), 3, 8);
+  bench::Fill(dib);
+  for (auto _ : state) {
+    std::FILE* const raw = std::fopen(file.Name(), "wb");
+    if (raw == nullptr || std::fwrite(dib.GetDataPtr(), dib.GetImageSize(), 1, raw) != 1) {
+      state.SkipWithError("cannot write");
+      return;
+    }
+    std::fclose(raw);
+  }
+  ReportPixels(state, dib);
+}
+
+void ReadRaw(benchmark::State& state) {
+  const bench::ScratchFile file(".raw");
+  dDIB dib(Edge(), Edge(), 3, 8);
+  bench::Fill(dib);
+  dib.Save(file.Name(), true);
+  for (auto _ : state) {
+    std::FILE* const raw = std::fopen(file.Name(), "rb");
+    if (raw == nullptr || std::fread(dib.GetDataPtr(), dib.GetImageSize(), 1, raw) != 1) {
+      state.SkipWithError("cannot read");
+      return;
+    }
+    std::fclose(raw);
+    benchmark::ClobberMemory();
+  }
+  ReportPixels(state, dib);
+}
+
 void Memcpy24(benchmark::State& state) {
   bench::Memcpy(state, std::uint64_t{3} * bench::Shrunk(kEdge) * bench::Shrunk(kEdge));
 }
@@ -116,6 +145,9 @@ BENCHMARK(Save)->Name("dDIB/save/24bit")->Unit(benchmark::kMicrosecond);
 BENCHMARK(LoadImage24)->Name("opDIB2Ima/load/24bit")->Unit(benchmark::kMicrosecond);
 BENCHMARK(LoadImage8)->Name("opDIB2Ima/load/8bit")->Unit(benchmark::kMicrosecond);
 BENCHMARK(LoadBitmap24)->Name("dDIB/load/24bit")->Unit(benchmark::kMicrosecond);
+BENCHMARK(Open)->Name("dDIB/open/24bit")->Unit(benchmark::kMicrosecond);
+BENCHMARK(WriteRaw)->Name("dDIB/fwrite/24bit")->Unit(benchmark::kMicrosecond);
+BENCHMARK(ReadRaw)->Name("dDIB/fread/24bit")->Unit(benchmark::kMicrosecond);
 BENCHMARK(Memcpy24)->Name("dDIB/memcpy/24bit")->Unit(benchmark::kMicrosecond);
 
 }  // namespace

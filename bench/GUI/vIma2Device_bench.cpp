@@ -39,10 +39,10 @@ void DrawImage(benchmark::State& state, const char* sequence, bool transparent) 
   Run(state, screen, [&] { return renderer.Draw(screen); });
 }
 
-// The same without the class around it.
-void StretchBits(benchmark::State& state, const char* sequence) {
+// An image of edge x edge pixels without the class around it.
+void StretchBits(benchmark::State& state, const char* sequence, unsigned long imageEdge) {
   dImage image;
-  image.Init(bench::Shrunk(512), bench::Shrunk(512), ImageDataType_U8, sequence,
+  image.Init(bench::Shrunk(imageEdge), bench::Shrunk(imageEdge), ImageDataType_U8, sequence,
              ImageDataOrder_Pixel, 4);
   bench::Fill(image);
   dImaDescriptorDIB descriptor(image);
@@ -112,11 +112,17 @@ BENCHMARK_CAPTURE(DrawImage, 32, "BGRA", false)
 BENCHMARK_CAPTURE(DrawImage, transparent, "BGR", true)
     ->Name("vIma2Device/24bit/transparent")
     ->Unit(benchmark::kMicrosecond);
-BENCHMARK_CAPTURE(StretchBits, 8, "G")
+BENCHMARK_CAPTURE(StretchBits, 8, "G", 512)
     ->Name("device/StretchDIBits/8bit")
     ->Unit(benchmark::kMicrosecond);
-BENCHMARK_CAPTURE(StretchBits, 32, "BGRA")
+BENCHMARK_CAPTURE(StretchBits, 8, "G", 2048)
+    ->Name("device/StretchDIBits/8bit/2048")
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(StretchBits, 32, "BGRA", 512)
     ->Name("device/StretchDIBits/32bit")
+    ->Unit(benchmark::kMicrosecond);
+BENCHMARK_CAPTURE(StretchBits, 32, "BGRA", 2048)
+    ->Name("device/StretchDIBits/32bit/2048")
     ->Unit(benchmark::kMicrosecond);
 BENCHMARK(Copy)->Name("device/BitBlt/copy")->Unit(benchmark::kMicrosecond);
 BENCHMARK(Invert)->Name("device/BitBlt/invert")->Unit(benchmark::kMicrosecond);

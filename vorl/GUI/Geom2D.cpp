@@ -10,6 +10,7 @@
 
 inline namespace vorl {
 
+using vorl_detail::Difference;
 using vorl_detail::kNearZero;
 
 namespace {
@@ -18,15 +19,31 @@ bool IsFinite(const dVect2D& v) {
   return std::isfinite(v.x) && std::isfinite(v.y);
 }
 
+/// The components of a vector, for tests that are made for each object under the mouse: every
+/// vector is counted when it is made and when it goes, which takes longer than such a test.
+struct Way {
+  explicit Way(const dVect2D& v) : x(v.x), y(v.y) {}
+  Way(const dVect2D& from, const dVect2D& to)
+      : x(Difference(to.x, from.x)), y(Difference(to.y, from.y)) {}
+
+  double Length2() const { return Product(*this); }
+  double Product(const Way& other) const {
+    return static_cast<double>(x) * other.x + static_cast<double>(y) * other.y;
+  }
+
+  float x;
+  float y;
+};
+
 /// The rest of `r` that does not run along `dir`, squared, with the place t along it.
-double Distance2Beside(const dVect2D& r, const dVect2D& dir, double t) {
+double Distance2Beside(const Way& r, const Way& dir, double t) {
   const double x = r.x - t * dir.x;
   const double y = r.y - t * dir.y;
   return x * x + y * y;
 }
 
 /// Where the foot of `r` on `dir` stands, in lengths of `dir`; NaN when it has none.
-double PlaceAlong(const dVect2D& r, const dVect2D& dir) {
+double PlaceAlong(const Way& r, const Way& dir) {
   return r.Product(dir) / dir.Length2();
 }
 
@@ -94,7 +111,7 @@ bool Clip(const Line& line, const tagRECT& rect, dVect2D& start, dVect2D& end) {
 }  // namespace
 
 bool Geom2D::IsPointOnPoint(const dVect2D& p, const dVect2D& q, double tolerance) {
-  return dVect2D(p, q).Length2() <= tolerance * tolerance;
+  return Way(p, q).Length2() <= tolerance * tolerance;
 }
 
 bool Geom2D::IsPointOnPoint(const tagPOINT& p, const tagPOINT& q, double tolerance) {
@@ -106,15 +123,16 @@ bool Geom2D::IsPointOnPoint(const tagPOINT& p, const tagPOINT& q, double toleran
 
 bool Geom2D::IsPointOnLine(const dVect2D& p, const dVect2D& pos, const dVect2D& dir,
                            double tolerance) {
-  const dVect2D r(pos, p);
+  const Way r(pos, p);
+  const Way along(dir);
   // Without a direction the place is NaN, and so the distance, which is at most nothing then.
-  return Distance2Beside(r, dir, PlaceAlong(r, dir)) <= tolerance * tolerance;
+  return Distance2Beside(r, along, PlaceAlong(r, along)) <= tolerance * tolerance;
 }
 
 bool Geom2D::IsPointOnLineSegment(const dVect2D& p, const dVect2D& a, const dVect2D& b,
                                   double tolerance) {
-  const dVect2D d(a, b);
-  const dVect2D r(a, p);
+  const Way d(a, b);
+  const Way r(a, p);
   const double t = PlaceAlong(r, d);
   return t >= 0.0 && t <= 1.0 && Distance2Beside(r, d, t) <= tolerance * tolerance;
 }

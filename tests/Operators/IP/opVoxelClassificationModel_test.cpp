@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <array>
+#include <limits>
 
 #include "ClassificationBench.h"
 #include "Scenes.h"
@@ -194,6 +195,47 @@ TEST(opVoxelClassificationModel, UnsignedVolumesEqualTheModel) {
 
 TEST(opVoxelClassificationModel, SignedVolumesEqualTheModel) {
   CheckCases<std::int16_t>(ImageDataType_S16, 52);
+}
+
+// As many voxels as are counted apart from the operator's counters first. Runs of equal values
+// among random ones.
+template <class T>
+void CheckLarge(unsigned short type) {
+  Random random(77);
+  dVolume volume;
+  for (int z = 0; z < 9; ++z) {
+    dSlice slice;
+    dImage& image = slice.GetImage();
+    ASSERT_TRUE(image.Init(131UL, 127UL, type, "G", ImageDataOrder_Pixel, 4));
+    int value = 0;
+    for (int y = 0; y < 127; ++y) {
+      for (int x = 0; x < 131; ++x) {
+        if (z % 2 == 0 || random.Between(0, 60) == 0) {
+          value = random.Between(std::numeric_limits<T>::min(), std::numeric_limits<T>::max());
+        }
+        *static_cast<T*>(image.GetDataPtr(x, y)) = static_cast<T>(value);
+      }
+    }
+    ASSERT_EQ(volume.AddSlice(slice), z);
+  }
+  for (const int algo : {401, 402}) {
+    const bool signedValues = type == ImageDataType_S16 && algo == 401;
+    opVoxelClassification op;
+    op.volume = &volume;
+    op.SelectAlgo(static_cast<short>(algo));
+    ASSERT_TRUE(op.Run()) << rasters::MessageOf(op);
+    EXPECT_EQ(classification_bench::CountsOf(op, signedValues ? 32768 : 0),
+              CountsOf(ClassesOf<T>(volume, algo), algo))
+        << algo;
+  }
+}
+
+TEST(opVoxelClassificationModel, LargeVolumesOfUnsignedValuesAreCountedAsSmallOnes) {
+  CheckLarge<unsigned short>(ImageDataType_U16);
+}
+
+TEST(opVoxelClassificationModel, LargeVolumesOfSignedValuesAreCountedAsSmallOnes) {
+  CheckLarge<short>(ImageDataType_S16);
 }
 
 }  // namespace

@@ -129,20 +129,34 @@ class RowConverter {
                  static_cast<unsigned long long>(rowBytes));
       return false;
     }
+    if (!(m_isCopied ? CopyRows() : ConvertRows())) {
+      m_source.SetCutOff(status);
+      return false;
+    }
+    return true;
+  }
+
+ private:
+  unsigned char* RowPtr(int storedRow) {
     const int height = static_cast<int>(m_source.Height());
-    for (int i = 0; i < height; ++i) {
-      auto* row = static_cast<unsigned char*>(
-          m_image.GetRowPtr(m_source.IsBottomUp() ? height - 1 - i : i));
-      if (!(m_isCopied ? m_source.ReadRow(row, static_cast<std::size_t>(rowBytes))
-                       : ReadPacked(row))) {
-        m_source.SetCutOff(status);
+    return static_cast<unsigned char*>(
+        m_image.GetRowPtr(m_source.IsBottomUp() ? height - 1 - storedRow : storedRow));
+  }
+
+  bool CopyRows() {
+    const auto step = static_cast<std::ptrdiff_t>(m_image.GetBytesPerRow());
+    return m_source.ReadAllRows(RowPtr(0), m_source.IsBottomUp() ? -step : step);
+  }
+
+  bool ConvertRows() {
+    for (int i = 0; i < static_cast<int>(m_source.Height()); ++i) {
+      if (!ReadPacked(RowPtr(i))) {
         return false;
       }
     }
     return true;
   }
 
- private:
   bool ReadPacked(unsigned char* row) {
     auto* packed = static_cast<unsigned char*>(m_packed.Get(0));
     const auto width = static_cast<std::size_t>(m_source.Width());

@@ -9,11 +9,14 @@
 #include <cmath>
 #include <cstring>
 #include <limits>
+#include <optional>
+#include <vector>
 
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Operators/IP/kernels/VolumeView.h>
 #include <vorl/Operators/IP/kernels/VoxelClasses.h>
 #include <vorl/Operators/IP/kernels/VoxelList.h>
+#include <vorl/Operators/IP/kernels/VoxelRuns.h>
 
 inline namespace vorl {
 
@@ -46,6 +49,40 @@ int LowerThreshold(const std::uint32_t* counters, int lowBound, int highClass,
   }
   return lowBound;
 }
+
+// The values of T from `lower` to before `end`; none when there are none.
+template <class T>
+std::optional<vorl_detail::ClassRange> RangeOf(int lower, int end) {
+  const int first = std::max<int>(lower, std::numeric_limits<T>::min());
+  const int last = std::min<int>(end - 1, std::numeric_limits<T>::max());
+  if (first > last) {
+    return std::nullopt;
+  }
+  return vorl_detail::ClassRange{static_cast<std::uint16_t>(first),
+                                 static_cast<std::uint16_t>(last - first)};
+}
+
+// The bits of a row's values, or the edge classes that `run` makes of them.
+class ClassRow {
+ public:
+  ClassRow(vorl_detail::EdgeClassRun* run, const vorl_detail::VoxelBox& box)
+      : m_run(run), m_classes(run == nullptr || box.IsEmpty() ? 0 : box.endX - box.firstX) {}
+
+  template <class T>
+  const std::uint16_t* Of(const vorl_detail::VoxelRow<T>& row) {
+    const auto* voxels = reinterpret_cast<const std::uint16_t*>(row.voxels) + row.firstX;
+    if (m_run == nullptr) {
+      return voxels;
+    }
+    m_run(voxels, reinterpret_cast<const std::uint16_t*>(row.below) + row.firstX, m_classes.size(),
+          m_classes.data());
+    return m_classes.data();
+  }
+
+ private:
+  vorl_detail::EdgeClassRun* m_run;
+  std::vector<std::uint16_t> m_classes;
+};
 
 }  // namespace
 
@@ -265,21 +302,36 @@ bool opVoxelClassification::SelectVoxels() {
 template <class T>
 bool opVoxelClassification::Count(int algo, const dVolume& source, const dVOI* region,
                                   std::uint32_t* counters) {
-  const auto count = [&](auto classOf) {
+  const auto count = [&](auto classOf, auto countedAs, vorl_detail::EdgeClassRun* edgeClasses) {
     using Class = decltype(classOf);
     const vorl_detail::VoxelBox box(source, region, Class::kNeighbours);
+    vorl_detail::ValueCounter counter(box.Count());
+    ClassRow classes(edgeClasses, box);
     const auto visit = [&](const vorl_detail::VoxelRow<T>& row) {
+      if (counter.IsValid()) {
+        counter.Count(classes.Of(row), row.endX - row.firstX);
+        return;
+      }
       for (std::uint32_t x = row.firstX; x < row.endX; ++x) {
         const std::int32_t voxelClass = Class::Of(row, x);
         ++counters[Class::kNeighbours != 0 ? std::max(voxelClass, 0) : voxelClass];
       }
     };
     vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress}, source, box, visit);
+    if (counter.IsValid()) {
+      counter.ForEach(
+          [&](std::uint16_t bits, std::uint32_t times) { counters[countedAs(bits)] += times; });
+    }
   };
   if (algo == VoxelClassificationAlgo_Edge) {
-    count(vorl_detail::EdgeClass{});
+    count(
+        vorl_detail::EdgeClass{},
+        [](std::uint16_t bits) { return std::max<int>(static_cast<std::int16_t>(bits), 0); },
+        vorl_detail::ActiveVoxelKernels().edgeClasses);
   } else {
-    count(vorl_detail::ValueClass{});
+    count(
+        vorl_detail::ValueClass{}, [](std::uint16_t bits) { return static_cast<T>(bits); },
+        nullptr);
   }
   return true;
 }
@@ -291,30 +343,30 @@ bool opVoxelClassification::Select(int classAlgo, const dVolume& source, const d
   const std::uint32_t capacity = static_cast<std::uint32_t>(list.GetSize() / kEntryBytes);
   const int lower = LowerThreshold(counters, lowBound, highClass, capacity);
   auto* entries = static_cast<unsigned char*>(list.Get(0));
-  std::uint32_t written = 0;
-  const auto select = [&](auto classOf) {
+  std::size_t written = 0;
+  const auto& kernels = vorl_detail::ActiveVoxelKernels();
+  const auto select = [&](auto classOf, auto classType, vorl_detail::EdgeClassRun* edgeClasses) {
     using Class = decltype(classOf);
+    const auto range = RangeOf<decltype(classType)>(lower, highClass);
     const vorl_detail::VoxelBox box(source, region, Class::kNeighbours);
+    ClassRow classes(edgeClasses, box);
     const auto visit = [&](const vorl_detail::VoxelRow<T>& row) {
-      for (std::uint32_t x = row.firstX; x < row.endX; ++x) {
-        const std::int32_t voxelClass = Class::Of(row, x);
-        // The limit holds whatever has become of the volume since it was classified.
-        if (voxelClass >= lower && voxelClass < highClass && written < capacity) {
-          const std::uint32_t entry = vorl_detail::PackVoxel(x, row.y, row.z);
-          std::memcpy(entries + std::size_t{written} * kEntryBytes, &entry, kEntryBytes);
-          ++written;
-        }
+      // The limit holds whatever has become of the volume since it was classified.
+      if (range && written < capacity) {
+        written += kernels.select(classes.Of(row), row.endX - row.firstX, *range,
+                                  vorl_detail::PackVoxel(0, row.y, row.z), row.firstX,
+                                  entries + written * kEntryBytes, capacity - written);
       }
     };
     vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress}, source, box, visit);
   };
   if (classAlgo == VoxelClassificationAlgo_Edge) {
-    select(vorl_detail::EdgeClass{});
+    select(vorl_detail::EdgeClass{}, std::int16_t{}, kernels.edgeClasses);
   } else {
-    select(vorl_detail::ValueClass{});
+    select(vorl_detail::ValueClass{}, T{}, nullptr);
   }
   // A list in foreign memory becomes one of its own here, for which there may be no memory.
-  const unsigned long bytes = static_cast<unsigned long>(written) * kEntryBytes;
+  const auto bytes = static_cast<unsigned long>(written * kEntryBytes);
   list.Resize(bytes);
   return list.GetSize() == bytes;
 }

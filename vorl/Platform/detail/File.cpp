@@ -6,10 +6,14 @@
 #include <sys/stat.h>
 #include <sys/types.h>
 
+#include <algorithm>
+#include <cerrno>
+
 #if defined(_WIN32)
 #include <io.h>
 #else
 #include <fcntl.h>
+#include <sys/uio.h>
 #include <unistd.h>
 #endif
 
@@ -95,6 +99,50 @@ bool SeekFile(std::FILE* file, std::uint64_t position) {
   return fseeko(file, static_cast<off_t>(position), SEEK_SET) == 0;
 #endif
 }
+
+#if defined(_WIN32)
+bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
+                  std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows) {
+  if (!SeekFile(file, position)) {
+    return false;
+  }
+  for (std::size_t i = 0; i < rows; ++i) {
+    if (std::fread(first + step * static_cast<std::ptrdiff_t>(i), 1, rowBytes, file) != rowBytes) {
+      return false;
+    }
+  }
+  return true;
+}
+#else
+bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
+                  std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows) {
+  constexpr std::size_t kAtOnce = 64;
+  std::size_t row = 0;
+  std::size_t filled = 0;  // bytes of that row
+  while (row < rows && rowBytes != 0) {
+    iovec parts[kAtOnce];
+    const std::size_t count = std::min(kAtOnce, rows - row);
+    for (std::size_t i = 0; i < count; ++i) {
+      const std::size_t skipped = i == 0 ? filled : 0;
+      parts[i].iov_base = first + step * static_cast<std::ptrdiff_t>(row + i) + skipped;
+      parts[i].iov_len = rowBytes - skipped;
+    }
+    const ssize_t read =
+        preadv(fileno(file), parts, static_cast<int>(count), static_cast<off_t>(position));
+    if (read < 0 && errno == EINTR) {
+      continue;
+    }
+    if (read <= 0) {
+      return false;
+    }
+    position += static_cast<std::uint64_t>(read);
+    filled += static_cast<std::size_t>(read);
+    row += filled / rowBytes;
+    filled %= rowBytes;
+  }
+  return true;
+}
+#endif
 
 }  // namespace vorl_detail
 }  // namespace vorl

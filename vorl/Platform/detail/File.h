@@ -1,6 +1,7 @@
 #ifndef VORL_PLATFORM_DETAIL_FILE_H
 #define VORL_PLATFORM_DETAIL_FILE_H
 
+#include <cstddef>
 #include <cstdint>
 #include <cstdio>
 #include <memory>
@@ -27,6 +28,13 @@ std::uint64_t FileSize(std::FILE* file);
 
 /// Puts the position of an open file at a byte; false when the system refuses.
 bool SeekFile(std::FILE* file, std::uint64_t position);
+
+/// Fills rows with the bytes of an open file from a position on, one row after the other, past the
+/// file's buffer and without a copy. The rows lie `step` bytes apart, downwards or upwards. False
+/// when the file has fewer bytes or the system refuses. The file's own position is undefined
+/// afterwards.
+bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
+                  std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows);
 
 }  // namespace vorl_detail
 }  // namespace vorl

@@ -2,11 +2,13 @@
 
 #include <vorl/Platform/soft/Rop3.h>
 #include <vorl/Platform/soft/RowConverter.h>
+#include <vorl/Platform/soft/StretchKernels.h>
 
 #include <algorithm>
 #include <bit>
 #include <cstring>
 #include <memory>
+#include <optional>
 #include <utility>
 
 inline namespace vorl {
@@ -18,29 +20,6 @@ MonoColours ColoursFor(const DeviceContext& context, const BlitSource& source) {
   return MonoColours{NearestPixel(target, context.state.textColour),
                      NearestPixel(target, context.state.backgroundColour),
                      NearestPixel(source.surface.format, source.background)};
-}
-
-template <int kBytes>
-void Gather(const std::uint8_t* units, const int* columns, int count, std::uint8_t* target) {
-  for (int i = 0; i < count; ++i) {
-    std::memcpy(target + static_cast<std::ptrdiff_t>(i) * kBytes,
-                units + static_cast<std::ptrdiff_t>(columns[i]) * kBytes, kBytes);
-  }
-}
-
-void GatherUnits(const std::uint8_t* units, int bytes, const std::vector<int>& columns,
-                 std::uint8_t* target) {
-  const int count = static_cast<int>(columns.size());
-  switch (bytes) {
-    case 1:
-      return Gather<1>(units, columns.data(), count, target);
-    case 2:
-      return Gather<2>(units, columns.data(), count, target);
-    case 3:
-      return Gather<3>(units, columns.data(), count, target);
-    default:
-      return Gather<4>(units, columns.data(), count, target);
-  }
 }
 
 // Delivers the rows of a blit's source, stretched and converted to the units of the destination.
@@ -61,6 +40,12 @@ class RowSource {
     m_columns = x.last;
     for (int& column : m_columns) {
       column -= m_left;
+    }
+    m_repeats = m_sourceCount < static_cast<int>(m_columns.size());
+    if (!x.contiguous) {
+      m_plan.emplace(m_columns, m_sourceCount,
+                     m_repeats ? m_targetBytes : source.surface.format.BytesPerUnit(),
+                     ActiveStretchKernels());
     }
     m_combines = (m_mode == BLACKONWHITE || m_mode == WHITEONBLACK) &&
                  (x.first != x.last || y.first != y.last);
@@ -101,11 +86,11 @@ class RowSource {
   }
 
   const std::uint8_t* Stretched(const std::uint8_t* units, int bytes) {
-    if (m_x.contiguous) {
+    if (!m_plan) {
       return units;
     }
     m_stretched.resize(m_columns.size() * static_cast<std::size_t>(bytes));
-    GatherUnits(units, bytes, m_columns, m_stretched.data());
+    m_plan->Gather(units, m_stretched.data());
     return m_stretched.data();
   }
 
@@ -113,7 +98,7 @@ class RowSource {
   const std::uint8_t* Single(int row) {
     const std::uint8_t* units = SourceUnits(row);
     const int count = static_cast<int>(m_columns.size());
-    if (m_sourceCount < count) {
+    if (m_repeats) {
       return Stretched(Converted(units, m_sourceCount), m_targetBytes);
     }
     return Converted(Stretched(units, m_surface.format.BytesPerUnit()), count);
@@ -154,6 +139,8 @@ class RowSource {
   int m_left = 0;              // the leftmost source column that is needed
   int m_sourceCount = 0;       // the source columns from there to the rightmost
   std::vector<int> m_columns;  // for each target column its source column, counted from m_left
+  bool m_repeats = false;      // fewer source than target columns
+  std::optional<GatherPlan> m_plan;
   bool m_combines = false;
   int m_firstRow = 0;
   int m_lastRow = 0;

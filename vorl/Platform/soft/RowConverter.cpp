@@ -126,7 +126,8 @@ void RowConverter::ChooseForIndices(const MonoColours& colours) {
       m_convert = &RowConverter::ConvertIndices<3>;
       return;
     default:
-      m_convert = &RowConverter::ConvertIndices<4>;
+      m_pixels = PixelTable(m_table);
+      m_convert = &RowConverter::ConvertIndicesTo32;
   }
 }
 
@@ -176,6 +177,10 @@ void RowConverter::ConvertIndices(const std::uint8_t* source, std::uint8_t* targ
     Store<kBytes>(target, m_table[source[i]]);
     target += kBytes;
   }
+}
+
+void RowConverter::ConvertIndicesTo32(const std::uint8_t* source, std::uint8_t* target, int count) {
+  ActiveStretchKernels().mapTo32(source, target, static_cast<std::size_t>(count), m_pixels);
 }
 
 template <int kSourceBytes, int kTargetBytes>

@@ -1,6 +1,7 @@
 #ifndef VORL_PLATFORM_SOFT_ROWCONVERTER_H
 #define VORL_PLATFORM_SOFT_ROWCONVERTER_H
 
+#include <vorl/Platform/soft/StretchKernels.h>
 #include <vorl/Platform/soft/Surface.h>
 
 #include <array>
@@ -41,6 +42,7 @@ class RowConverter {
   std::uint32_t Translate(std::uint32_t pixel);
   template <int kBytes>
   void ConvertIndices(const std::uint8_t* source, std::uint8_t* target, int count);
+  void ConvertIndicesTo32(const std::uint8_t* source, std::uint8_t* target, int count);
   template <int kSourceBytes, int kTargetBytes>
   void ConvertPixels(const std::uint8_t* source, std::uint8_t* target, int count);
   void Convert24To32(const std::uint8_t* source, std::uint8_t* target, int count);
@@ -54,6 +56,7 @@ class RowConverter {
   std::uint32_t m_white = 0;
   Function m_convert = nullptr;
   std::array<std::uint32_t, 256> m_table{};  // from the units of up to 8 bits
+  PixelTable m_pixels;                       // the same, for a target of 32 bits
   // The results for colours seen before, found by a hash: the search of a table is long.
   struct Known {
     std::uint32_t pixel = 0;

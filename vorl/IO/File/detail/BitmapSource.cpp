@@ -78,6 +78,16 @@ void BitmapSource::SetTables(const unsigned char* tables, std::size_t bytes) {
   paletteEntries = static_cast<unsigned int>(entries);
 }
 
+bool BitmapSource::ReadAllRows(unsigned char* first, std::ptrdiff_t step) {
+  for (std::uint64_t i = 0; i < Height(); ++i) {
+    if (!ReadRow(first + step * static_cast<std::ptrdiff_t>(i),
+                 static_cast<std::size_t>(RowBytes()))) {
+      return false;
+    }
+  }
+  return true;
+}
+
 BitmapInMemory::BitmapInMemory(const tagBITMAPINFO* info, const void* bits)
     : m_bits(static_cast<const unsigned char*>(bits)) {
   std::memcpy(&header, info, sizeof(header.biSize));
@@ -142,6 +152,7 @@ bool BitmapInFile::ReadHeaders(dStatus& status) {
     return false;
   }
   SetTables(tables.data(), tableBytes);
+  m_pixelPosition = fileHeader.bfOffBits;
   pixelBytes = fileHeader.bfSize - fileHeader.bfOffBits;
   return true;
 }
@@ -152,6 +163,11 @@ bool BitmapInFile::Read(void* target, std::size_t bytes) {
 
 bool BitmapInFile::ReadRow(void* target, std::size_t bytes) {
   return Read(target, bytes);
+}
+
+bool BitmapInFile::ReadAllRows(unsigned char* first, std::ptrdiff_t step) {
+  return ReadFileRows(m_file.get(), m_pixelPosition, first, step,
+                      static_cast<std::size_t>(RowBytes()), static_cast<std::size_t>(Height()));
 }
 
 void BitmapInFile::SetCutOff(dStatus& status) const {

@@ -10,6 +10,7 @@
 #include <vorl/Platform/detail/File.h>
 
 #include <array>
+#include <cstddef>
 #include <cstdint>
 
 inline namespace vorl {
@@ -31,6 +32,9 @@ class BitmapSource {
 
   /// Copies the next bytes of the pixels; false when they cannot be had.
   virtual bool ReadRow(void* target, std::size_t bytes) = 0;
+  /// Copies all rows as they are stored, before any was read, to places `step` bytes apart; false
+  /// when they cannot be had.
+  virtual bool ReadAllRows(unsigned char* first, std::ptrdiff_t step);
   /// What to tell when rows are missing.
   virtual void SetCutOff(dStatus& status) const = 0;
 
@@ -82,6 +86,7 @@ class BitmapInFile : public BitmapSource {
   bool Open(const char* path, dStatus& status);
 
   bool ReadRow(void* target, std::size_t bytes) override;
+  bool ReadAllRows(unsigned char* first, std::ptrdiff_t step) override;
   void SetCutOff(dStatus& status) const override;
 
  private:
@@ -91,6 +96,7 @@ class BitmapInFile : public BitmapSource {
   RowBuffer m_buffer;
   FileHandle m_file;
   const char* m_path = nullptr;
+  std::uint64_t m_pixelPosition = 0;
 };
 
 }  // namespace vorl_detail

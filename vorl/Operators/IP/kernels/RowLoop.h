@@ -21,18 +21,21 @@ struct RunControl {
 /// Calls `row(i)` for i = 0 .. count - 1. A stop request is honoured before each row, progress
 /// stored once after each; where there are no rows, all is done at once. Returns false when
 /// stopped.
+///
+/// Progress is seen before the next request is looked for: whoever asks to stop and then for the
+/// progress sees at most one more row done, however short rows are.
 template <class Row>
 bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
   if (count == 0) {
     control.progress.store(1.0, std::memory_order_relaxed);
   }
   for (std::size_t i = 0; i < count; ++i) {
-    if (control.stopRequested.load(std::memory_order_relaxed)) {
+    if (control.stopRequested.load(std::memory_order_seq_cst)) {
       return false;
     }
     row(i);
     control.progress.store(static_cast<double>(i + 1) / static_cast<double>(count),
-                           std::memory_order_relaxed);
+                           std::memory_order_seq_cst);
   }
   return true;
 }

@@ -72,6 +72,10 @@ struct VoxelBox {
 
   bool IsEmpty() const { return firstX >= endX || firstY >= endY || firstZ >= endZ; }
 
+  std::uint64_t Count() const {
+    return IsEmpty() ? 0 : std::uint64_t{endX - firstX} * (endY - firstY) * (endZ - firstZ);
+  }
+
   std::uint32_t firstX;
   std::uint32_t endX;
   std::uint32_t firstY;
