@@ -31,4 +31,14 @@ class AllocationDelay {
   ~AllocationDelay();
 };
 
+/// While one lives, the blocks that `new` gives in the thread that made it, 16 at a time, end
+/// where memory ends (see `GuardPages`). They may live longer.
+class AllocationGuard {
+ public:
+  AllocationGuard();
+  AllocationGuard(const AllocationGuard&) = delete;
+  AllocationGuard& operator=(const AllocationGuard&) = delete;
+  ~AllocationGuard();
+};
+
 #endif

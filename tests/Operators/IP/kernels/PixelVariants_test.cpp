@@ -1,12 +1,13 @@
 // Every variant of the pixel loops that can run here gives the same bits as the plain loops, for
 // every length up to four registers and one sample more, at every misalignment, on random samples
-// and the extremes, and touches nothing beside its run.
+// and the extremes, reads nothing beside its run, and writes nothing beside its target.
 #include <vorl/Operators/IP/kernels/Pixels.h>
 #include <vorl/Operators/IP/kernels/WindowRamp.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/GuardPages.h>
 
-#include <cstring>
+#include <algorithm>
 #include <limits>
 #include <random>
 #include <string>
@@ -53,17 +54,54 @@ std::vector<T> RandomSamples(std::size_t count, std::mt19937& random) {
   return samples;
 }
 
-// Calls `check(samples, count)` with runs of every length and misalignment. Behind the run stands
-// memory that the address sanitizer watches, as each run ends with its block.
+// Calls `check(samples, count)` with runs of every length and misalignment. What may not be read
+// follows upon each run, or precedes it.
 template <class T, class Check>
 void ForEachRun(Check check) {
-  std::mt19937 random(7);
+  constexpr unsigned kSeed = 7;
+  SCOPED_TRACE("seed " + std::to_string(kSeed));
+  std::mt19937 random(kSeed);
   for (std::size_t count = 0; count <= kLongest; ++count) {
+    const std::vector<T> samples = RandomSamples<T>(count, random);
+    for (const GuardPages::Side side : GuardPages::kSides) {
+      const GuardPages block(count * sizeof(T), side);
+      T* const run = static_cast<T*>(block.Data());
+      std::copy(samples.begin(), samples.end(), run);
+      check(run, count);
+    }
     const std::size_t shift = random() % 32;
     const std::vector<T> block = RandomSamples<T>(shift + count, random);
     check(block.data() + shift, count);
   }
 }
+
+// The target of a run, at some misalignment between guards.
+template <class T>
+class GuardedTarget {
+ public:
+  explicit GuardedTarget(std::size_t count)
+      : m_block(kGuard + count % 32 + count + kGuard, kMark), m_first(kGuard + count % 32) {}
+
+  T* Data() { return m_block.data() + m_first; }
+  /// The samples are these, and the guards as they were. Says where they are not.
+  testing::AssertionResult Holds(const std::vector<T>& expected) const {
+    auto all = std::vector<T>(m_block.size(), kMark);
+    const auto first = static_cast<std::ptrdiff_t>(m_first);
+    std::copy(expected.begin(), expected.end(), all.begin() + first);
+    const auto [given, wanted] = std::mismatch(m_block.begin(), m_block.end(), all.begin());
+    if (given == m_block.end()) {
+      return testing::AssertionSuccess();
+    }
+    return testing::AssertionFailure() << "sample " << given - m_block.begin() - first << " is "
+                                       << +*given << " instead of " << +*wanted;
+  }
+
+ private:
+  static constexpr T kMark = 77;
+
+  std::vector<T> m_block;
+  std::size_t m_first;
+};
 
 template <class T>
 void ExpectSameExtremes(const PixelKernels& kernels) {
@@ -109,12 +147,9 @@ void ExpectSameScaling(const PixelKernels& kernels) {
     for (const auto& [factor, offset] : kScalings) {
       std::vector<T> expected(count);
       vorl_detail::RescaleRunRef(samples, expected.data(), count, factor, offset);
-      std::vector<T> given(count + kGuard, T{77});
-      rescale(samples, given.data(), count, factor, offset);
-      for (std::size_t i = 0; i < given.size(); ++i) {
-        ASSERT_EQ(given[i], i < count ? expected[i] : T{77})
-            << i << " of " << count << ", * " << factor << " + " << offset;
-      }
+      GuardedTarget<T> given(count);
+      rescale(samples, given.Data(), count, factor, offset);
+      ASSERT_TRUE(given.Holds(expected)) << count << ", * " << factor << " + " << offset;
       std::vector<T> inPlace(samples, samples + count);
       rescale(inPlace.data(), inPlace.data(), count, factor, offset);
       ASSERT_EQ(inPlace, expected) << count << ", * " << factor << " + " << offset;
@@ -129,17 +164,24 @@ TEST_P(PixelVariants, RescaleEqualsThePlainLoop) {
 
 TEST_P(PixelVariants, MappedBytesAreThePlainLoops) {
   std::mt19937 random(3);
-  const std::vector<std::uint8_t> entries = RandomSamples<std::uint8_t>(256, random);
-  ForEachRun<std::uint8_t>([&](const std::uint8_t* samples, std::size_t count) {
-    std::vector<std::uint8_t> given(count + kGuard, 77);
-    Kernels().mapBytes(samples, given.data(), count, entries.data());
-    std::vector<std::uint8_t> inPlace(samples, samples + count);
-    Kernels().mapBytes(inPlace.data(), inPlace.data(), count, entries.data());
-    for (std::size_t i = 0; i < given.size(); ++i) {
-      ASSERT_EQ(given[i], i < count ? entries[samples[i]] : 77) << i << " of " << count;
-      ASSERT_TRUE(i >= count || inPlace[i] == given[i]) << i << " of " << count << " in place";
-    }
-  });
+  for (const GuardPages::Side side : GuardPages::kSides) {
+    const GuardPages table(256, side);
+    auto* const entries = static_cast<std::uint8_t*>(table.Data());
+    const std::vector<std::uint8_t> values = RandomSamples<std::uint8_t>(256, random);
+    std::copy(values.begin(), values.end(), entries);
+    ForEachRun<std::uint8_t>([&](const std::uint8_t* samples, std::size_t count) {
+      std::vector<std::uint8_t> expected(samples, samples + count);
+      for (std::uint8_t& sample : expected) {
+        sample = entries[sample];
+      }
+      GuardedTarget<std::uint8_t> given(count);
+      Kernels().mapBytes(samples, given.Data(), count, entries);
+      ASSERT_TRUE(given.Holds(expected)) << count;
+      std::vector<std::uint8_t> inPlace(samples, samples + count);
+      Kernels().mapBytes(inPlace.data(), inPlace.data(), count, entries);
+      ASSERT_EQ(inPlace, expected) << count << " in place";
+    });
+  }
 }
 
 // Every sample there is, and every length of a run, through the ramp and through the table.
@@ -197,11 +239,13 @@ TEST_P(PixelVariants, WindowOfAnyLengthStaysInItsRun) {
     const auto ramp = WindowRamp::Of(lut, false, Kernels().window);
     ASSERT_TRUE(ramp);
     ForEachRun<std::uint16_t>([&](const std::uint16_t* samples, std::size_t count) {
-      std::vector<std::uint8_t> given(count + kGuard, 77);
-      Kernels().window(samples, given.data(), count, *ramp);
-      for (std::size_t i = 0; i < given.size(); ++i) {
-        ASSERT_EQ(given[i], i < count ? lut.GetLUT(0)[samples[i]] : 77) << i << " of " << count;
+      std::vector<std::uint8_t> expected;
+      for (std::size_t i = 0; i < count; ++i) {
+        expected.push_back(lut.GetLUT(0)[samples[i]]);
       }
+      GuardedTarget<std::uint8_t> given(count);
+      Kernels().window(samples, given.Data(), count, *ramp);
+      ASSERT_TRUE(given.Holds(expected)) << count;
     });
   }
 }

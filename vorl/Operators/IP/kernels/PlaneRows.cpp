@@ -48,8 +48,8 @@ bool Wraps(std::int64_t start, std::int64_t step, std::int64_t width) {
 std::optional<PointRange> FindInside(const FixedVector& limits, const FixedVector& point,
                                      const FixedVector& step, std::size_t width) {
   const auto count = static_cast<std::int64_t>(width);
-  if (count > kHighest || Wraps(point.x, step.x, count) || Wraps(point.y, step.y, count) ||
-      Wraps(point.z, step.z, count)) {
+  if (width > std::size_t{kHighest} || Wraps(point.x, step.x, count) ||
+      Wraps(point.y, step.y, count) || Wraps(point.z, step.z, count)) {
     return std::nullopt;
   }
   std::int64_t begin = 0;
