@@ -26,20 +26,21 @@ class RowSampler {
  public:
   RowSampler(const VolumeView& view, bool isLinear, CpuVariant variant)
       : m_limits(view.Limits()), m_grid(VolumeGrid::Of(view)) {
-    if (const PlaneKernels* const kernels = PlaneKernelsOf(variant)) {
+    const PlaneKernels* const kernels = PlaneKernelsOf(variant);
+    if (kernels != nullptr && m_grid) {
       m_run = (isLinear ? kernels->linear : kernels->nearest)[std::is_signed_v<T> ? 1 : 0];
     }
   }
 
   /// One sample per pixel, 0 outside.
   bool Thin(const FixedVector& point, const FixedVector& step, T* target, std::size_t width) {
-    const auto range = RangeOf(point, step, width);
-    if (!range) {
+    PointRange range;
+    if (!FindRange(point, step, width, range)) {
       return false;
     }
-    std::fill(target, target + range->begin, T{0});
-    Sample(*range, point, step, RowSink::Store, target);
-    std::fill(target + range->end, target + width, T{0});
+    std::fill(target, target + range.begin, T{0});
+    Sample(range, point, step, RowSink::Store, target);
+    std::fill(target + range.end, target + width, T{0});
     return true;
   }
 
@@ -75,9 +76,22 @@ class RowSampler {
   }
 
  private:
-  std::optional<PointRange> RangeOf(const FixedVector& point, const FixedVector& step,
-                                    std::size_t width) const {
-    return m_run != nullptr && m_grid ? FindInside(m_limits, point, step, width) : std::nullopt;
+  // The optional range is not passed on: its flag is a byte that would be read with its neighbours,
+  // which waits until the row before is in the cache (20 ns).
+  bool FindRange(const FixedVector& point, const FixedVector& step, std::size_t width,
+                 PointRange& range) const {
+    if (m_run == nullptr) {
+      return false;
+    }
+    if (IsRowInside(m_limits, point, step, width)) {
+      range = {0, static_cast<std::int32_t>(width)};
+      return true;
+    }
+    const auto found = FindInside(m_limits, point, step, width);
+    if (found) {
+      range = *found;
+    }
+    return found.has_value();
   }
 
   void Sample(const PointRange& range, const FixedVector& point, const FixedVector& step,
@@ -98,12 +112,12 @@ class RowSampler {
     m_numbers.assign(width, 0);
     FixedVector start = point;
     for (std::int32_t k = 0; k < slab.count; ++k) {
-      const auto range = RangeOf(start, step, width);
-      if (!range) {
+      PointRange range;
+      if (!FindRange(start, step, width, range)) {
         return false;
       }
-      note(*range);
-      Sample(*range, start, step, sink, m_numbers.data());
+      note(range);
+      Sample(range, start, step, sink, m_numbers.data());
       start += slab.step;
     }
     return true;
