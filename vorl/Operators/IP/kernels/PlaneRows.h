@@ -86,10 +86,27 @@ enum class RowSink {
 using SampleRun = void(const VolumeGrid& grid, const FixedVector& point, const FixedVector& step,
                        std::size_t count, RowSink sink, void* row);
 
+/// Four rows of voxels.
+struct RowSources {
+  const void* rows[4];
+};
+
+/// Raises a row of `count` samples to those of four rows, and fetches those that come next.
+using RowRaise = void(void* row, const RowSources& sources, const RowSources& next,
+                      std::size_t count);
+
+/// For each of `count` points of one x inside the volume: the largest voxel of its row of voxels in
+/// some ranges of columns, at least 0.
+using RowLargest = void(const VolumeGrid& grid, const FixedVector& point, const FixedVector& step,
+                        std::size_t count, const PointRange* columns, std::size_t ranges,
+                        void* row);
+
 /// One variant of each loop: for unsigned and for signed samples.
 struct PlaneKernels {
   SampleRun* nearest[2];
   SampleRun* linear[2];
+  RowRaise* raiseRow[2];
+  RowLargest* largestInRows[2];
 };
 
 /// The loops of a variant that can run here (see `CanRun`). Null for the reference, which has none:

@@ -6,12 +6,14 @@
 //    (PlaneAlongRow_body.h).
 // 2. Elsewhere the interpolation gathers pairs of neighbours (PlaneLinear_body.h).
 // 3. The nearest voxel is fetched one by one: gathering is no faster (PlaneNearest_body.h).
+// 4. The largest voxel of a slab along the grid is found in 16 bits (PlaneMaximum_body.h).
 //
 // Nothing that is inline elsewhere, too, is called here: it might be compiled for a machine that
 // others do not have, and kept as the one copy for all.
 
 #include <vorl/Operators/IP/kernels/PlaneAlongRow_body.h>
 #include <vorl/Operators/IP/kernels/PlaneLinear_body.h>
+#include <vorl/Operators/IP/kernels/PlaneMaximum_body.h>
 #include <vorl/Operators/IP/kernels/PlaneNearest_body.h>
 #include <vorl/Operators/IP/kernels/PlaneRows.h>
 #include <vorl/Operators/IP/kernels/PlaneSinks_body.h>
@@ -59,7 +61,9 @@ void Linear(const VolumeGrid& grid, const FixedVector& point, const FixedVector&
 }
 
 constexpr PlaneKernels kKernels = {{&Nearest<std::uint16_t>, &Nearest<std::int16_t>},
-                                   {&Linear<std::uint16_t>, &Linear<std::int16_t>}};
+                                   {&Linear<std::uint16_t>, &Linear<std::int16_t>},
+                                   {&RaiseRow<std::uint16_t>, &RaiseRow<std::int16_t>},
+                                   {&LargestInRows<std::uint16_t>, &LargestInRows<std::int16_t>}};
 
 }  // namespace
 }  // namespace vorl_detail
