@@ -9,20 +9,16 @@
 #include <cstddef>
 #include <cstdint>
 #include <iterator>
-#include <ostream>
 #include <sstream>
 #include <string>
 #include <type_traits>
 #include <vector>
 
-#include "PlaneSweep.h"
+#include "SlabPictures.h"
 
 namespace {
 
-using namespace plane_sweep;
-using vorl_detail::SlabSamples;
-using vorl_detail::SlicePlane;
-using vorl_detail::VolumeView;
+using namespace slab_pictures;
 
 class SlabVariants : public testing::TestWithParam<CpuVariant> {
  protected:
@@ -37,32 +33,6 @@ INSTANTIATE_TEST_SUITE_P(, SlabVariants, testing::Values(CpuVariant::Avx2, CpuVa
                          [](const auto& variant) {
                            return std::string(vorl_detail::NameOf(variant.param));
                          });
-
-struct Picture {
-  FixedVector start;
-  FixedVector columnStep;
-  FixedVector rowStep;
-  FixedVector depth;
-  std::int32_t depthSteps = 2;
-  std::size_t width = 1;
-  std::size_t height = 1;
-};
-
-std::ostream& operator<<(std::ostream& out, const Picture& picture) {
-  return out << picture.width << " x " << picture.height << " pixels from "
-             << row_cases::Text(picture.start) << ", columns "
-             << row_cases::Text(picture.columnStep) << ", rows " << row_cases::Text(picture.rowStep)
-             << ", slab " << row_cases::Text(picture.depth) << " in " << picture.depthSteps;
-}
-
-SlicePlane PlaneOf(const Picture& picture) {
-  SlicePlane plane{dSlice(), dCoordSys3D(), 0.0};
-  plane.start = picture.start;
-  plane.columnStep = picture.columnStep;
-  plane.rowStep = picture.rowStep;
-  plane.depthStep = picture.depth;
-  return plane;
-}
 
 /// Whether any row's coordinates wrap in the directions in which its points differ.
 bool WrapsAlongRows(const Picture& picture) {

@@ -33,9 +33,9 @@ struct Square {
 /// Registers of points anywhere inside the volume. A voxel and its right neighbour are gathered
 /// together; in the last column, where there is none, the pair to the left is.
 template <class T>
-class Gatherer {
+class LinearGatherer {
  public:
-  explicit Gatherer(const VolumeGrid& grid)
+  explicit LinearGatherer(const VolumeGrid& grid)
       : m_grid(grid),
         m_lastColumn(Numbers::All(grid.Width() - 1)),
         m_lastPair(Numbers::All(grid.Width() - 2)),
@@ -74,41 +74,6 @@ class Gatherer {
   const VolumeGrid& m_grid;
   Numbers m_lastColumn, m_lastPair, m_lastRow, m_pitch;
 };
-
-template <class T, class Sink>
-void LinearAnywhere(const VolumeGrid& grid, const FixedVector& point, const FixedVector& step,
-                    std::size_t count, const Sink& sink) {
-  const Gatherer<T> gatherer(grid);
-  const Numbers lane = Numbers::Lanes();
-  const auto at = [&](std::int32_t start, std::int32_t stride) {
-    return Numbers::All(start) + lane * Numbers::All(stride);
-  };
-  Numbers x = at(point.x, step.x);
-  Numbers y = at(point.y, step.y);
-  Numbers z = at(point.z, step.z);
-  const Numbers lanes = Numbers::All(static_cast<int>(Numbers::kCount));
-  const Numbers strideX = Numbers::All(step.x) * lanes;
-  const Numbers strideY = Numbers::All(step.y) * lanes;
-  const Numbers strideZ = Numbers::All(step.z) * lanes;
-  std::size_t i = 0;
-  for (; i + Numbers::kCount <= count; i += Numbers::kCount) {
-    sink.Put(i, gatherer.At(x, y, z));
-    x = x + strideX;
-    y = y + strideY;
-    z = z + strideZ;
-  }
-  if (i < count) {  // lanes beyond the row repeat its first point, and are not used
-    const auto isUsed = lane.IsBelow(Numbers::All(static_cast<int>(count - i)));
-    std::int32_t samples[Numbers::kCount];
-    gatherer
-        .At(Numbers::All(point.x).Replaced(isUsed, x), Numbers::All(point.y).Replaced(isUsed, y),
-            Numbers::All(point.z).Replaced(isUsed, z))
-        .Store(samples);
-    for (std::size_t k = 0; i + k < count; ++k) {
-      sink.Put(i + k, samples[k]);
-    }
-  }
-}
 
 }  // namespace
 }  // namespace vorl_detail

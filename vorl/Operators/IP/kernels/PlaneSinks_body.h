@@ -13,6 +13,7 @@ namespace {
 /// Where a row's samples go: one by one, or a register at a time.
 template <class T>
 struct StoreSink {
+  static constexpr bool kCollects = false;
   T* row;
 
   void Put(std::size_t i, std::int32_t sample) const { row[i] = static_cast<T>(sample); }
@@ -22,6 +23,7 @@ struct StoreSink {
 
 template <class T>
 struct MaximumSink {
+  static constexpr bool kCollects = true;  ///< samples of layer after layer
   std::int32_t* row;
 
   void Put(std::size_t i, std::int32_t sample) const { row[i] = sample > row[i] ? sample : row[i]; }
@@ -36,6 +38,7 @@ struct MaximumSink {
 
 template <class T>
 struct SumSink {
+  static constexpr bool kCollects = true;  ///< samples of layer after layer
   std::int32_t* row;
 
   void Put(std::size_t i, std::int32_t sample) const {

@@ -5,13 +5,15 @@
 //    neighbours are loaded, and interpolated in 16 bits where the samples leave room for it
 //    (PlaneAlongRow_body.h).
 // 2. Elsewhere the interpolation gathers pairs of neighbours (PlaneLinear_body.h).
-// 3. The nearest voxel is fetched one by one: gathering is no faster (PlaneNearest_body.h).
+// 3. The nearest voxels of slabs are gathered, those of planes fetched one by one
+//    (PlaneNearest_body.h).
 // 4. The largest voxel of a slab along the grid is found in 16 bits (PlaneMaximum_body.h).
 //
 // Nothing that is inline elsewhere, too, is called here: it might be compiled for a machine that
 // others do not have, and kept as the one copy for all.
 
 #include <vorl/Operators/IP/kernels/PlaneAlongRow_body.h>
+#include <vorl/Operators/IP/kernels/PlaneGather_body.h>
 #include <vorl/Operators/IP/kernels/PlaneLinear_body.h>
 #include <vorl/Operators/IP/kernels/PlaneMaximum_body.h>
 #include <vorl/Operators/IP/kernels/PlaneNearest_body.h>
@@ -28,7 +30,7 @@ void LinearRow(const VolumeGrid& grid, const FixedVector& point, const FixedVect
   if (IsAlongRow(step)) {
     LinearAlongRow<T>(grid, point, count, sink);
   } else {
-    LinearAnywhere<T>(grid, point, step, count, sink);
+    GatherRow(LinearGatherer<T>(grid), point, step, count, sink);
   }
 }
 
