@@ -153,11 +153,16 @@ class RowSampler {
 
   void Sample(const PointRange& range, const FixedVector& point, const FixedVector& step,
               RowSink sink, auto* row) {
-    if (range.begin < range.end) {
+    if (range.begin >= range.end) {
+      return;
+    }
+    const auto count = static_cast<std::size_t>(range.end - range.begin);
+    if (range.begin == 0) {  // the usual case, which needs no copy of a point just written
+      m_run(*m_grid, point, step, count, sink, row);
+    } else {
       FixedVector first = point;
       first += step.Times(range.begin);
-      m_run(*m_grid, first, step, static_cast<std::size_t>(range.end - range.begin), sink,
-            row + range.begin);
+      m_run(*m_grid, first, step, count, sink, row + range.begin);
     }
   }
 

@@ -1,8 +1,7 @@
 #include <vorl/Operators/IP/kernels/VolumeView.h>
 
 #include <algorithm>
-
-#include <vorl/Operators/IP/kernels/ImageCheck.h>
+#include <cstdint>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -22,12 +21,12 @@ class SliceCheck {
         m_bytesPerRow(first.GetBytesPerRow()) {}
 
   // Size and format; rows may be padded otherwise. Some kernels walk a slice's own rows, some those
-  // of the first slice: the pixels must suffice for both.
-  bool IsGood(const dImage& image) const {
+  // of the first slice: the pixels must suffice for both. `pixels` is where they begin.
+  bool IsGood(const dImage& image, const void* pixels) const {
+    const auto place = reinterpret_cast<std::uintptr_t>(pixels);
     return image.GetWidth() == m_width && image.GetHeight() == m_height &&
-           image.GetFormatID() == m_format &&
-           HoldsBytes(image, RasterBytes(std::max(image.GetBytesPerRow(), m_bytesPerRow)),
-                      kSampleBytes);
+           image.GetFormatID() == m_format && place != 0 && place % kSampleBytes == 0 &&
+           image.GetImageSize() >= RasterBytes(std::max(image.GetBytesPerRow(), m_bytesPerRow));
   }
 
  private:
@@ -61,10 +60,11 @@ VolumeView::VolumeView(const dVolume& volume)
   m_slices.push_back(first.GetDataPtr());
   for (const dSlice& slice : slices) {
     const dImage& image = slice.GetImage();
-    if (!m_invalidSlice && !check.IsGood(image)) {
+    const void* const pixels = image.GetDataPtr();
+    if (!m_invalidSlice && !check.IsGood(image, pixels)) {
       m_invalidSlice = static_cast<int>(m_slices.size()) - 1;
     }
-    m_slices.push_back(image.GetDataPtr());
+    m_slices.push_back(pixels);
   }
   m_slices.push_back(m_slices.back());
 }
