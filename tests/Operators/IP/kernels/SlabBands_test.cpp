@@ -169,4 +169,21 @@ TEST_P(SlabBandVariants, AStoppedRowIsLeftAsItIs) {
   EXPECT_EQ(pixels, std::vector<std::uint16_t>(picture.width, 0x5A5A));
 }
 
+TEST_P(SlabBandVariants, SlabsOfFarMoreLayersThanVoxelsAreLeftToThePlainLoops) {
+  Sweep<std::uint16_t> sweep(GetParam(), 304);
+  const GuardedVolume<std::uint16_t> volume({20, 9, 3}, {1, 500}, GuardPages::Side::Behind,
+                                            sweep.random);
+  const std::atomic<bool> isStopped = false;
+  RowSampler<std::uint16_t> rows(volume.View(), false, GetParam());
+  for (const bool isTooMany : {false, true}) {
+    const std::int32_t layers = isTooMany ? 65537 : 65536;
+    const Picture picture{{}, {kOne, 0, 0}, {0, kOne, 0}, {0, 0, kOne}, layers, 2, 2};
+    SlabBands<std::uint16_t> bands(rows, PlaneOf(picture), SlabSamples(picture.depth, layers),
+                                   RowSink::Maximum, isStopped);
+    std::vector<std::uint16_t> pixels(picture.width);
+    EXPECT_EQ(bands.Row(0, picture.height, picture.start, pixels.data(), picture.width),
+              !isTooMany);
+  }
+}
+
 }  // namespace

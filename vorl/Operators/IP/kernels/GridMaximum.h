@@ -125,10 +125,10 @@ class GridMaximum {
       m_kernels->raiseRow[kIsSigned](m_band.data() + last.row * m_width + range.begin, last.sources,
                                      next, static_cast<std::size_t>(range.end - range.begin));
     };
-    for (std::int32_t first = 0; first < m_slab.count; first += kSources) {
+    for (std::int64_t first = 0; first < m_slab.count; first += kSources) {
       for (std::size_t row = 0; row < m_bandRows; ++row) {
         Raise next{row, {}};
-        if (FindSources(row, first, next.sources)) {
+        if (FindSources(row, static_cast<std::int32_t>(first), next.sources)) {
           if (hasLast) {
             raise(next.sources);
           }

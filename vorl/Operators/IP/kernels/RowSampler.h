@@ -126,6 +126,7 @@ class RowSampler {
   // Of 32 columns interpolation is slower, of 128 the nearest voxel; of fewer rows both.
   static constexpr std::size_t kPieceColumns = 64;
   static constexpr std::size_t kPieceLayers = 16;
+  static constexpr std::int32_t kMostLayers = 65536;
 
   // Pixels of each row, and layers of the slab.
   struct Piece {
@@ -166,8 +167,12 @@ class RowSampler {
     }
   }
 
-  // What of each row is inside, layer by layer.
+  // What of each row is inside, layer by layer. Not for slabs of more layers than voxels: a list of
+  // them might not fit into memory.
   bool FindRanges(const SlabSamples& slab, const SlabRows& rows) {
+    if (m_run == nullptr || slab.count > kMostLayers) {
+      return false;
+    }
     m_layers = static_cast<std::size_t>(slab.count);
     m_ranges.resize(rows.height * m_layers);
     FixedVector first = rows.point;

@@ -32,7 +32,7 @@ class SlabBands {
            std::size_t width) {
     if (index >= m_end) {
       m_begin = index;
-      m_end = index + std::min(kBandRows, height - index);
+      m_end = index + std::min(BandRows(width), height - index);
       // Where one of the rows needs the plain loop, each goes by itself.
       if (!Collect(point, width)) {
         m_end = index + 1;
@@ -50,6 +50,13 @@ class SlabBands {
 
  private:
   static constexpr std::size_t kBandRows = 64;
+  static constexpr std::size_t kMostNumbers = std::size_t{1} << 20;  // that a band may take
+
+  // Fewer for rows of very many pixels or layers.
+  std::size_t BandRows(std::size_t width) const {
+    const std::size_t numbers = std::max(width, static_cast<std::size_t>(m_slab.count));
+    return std::clamp(kMostNumbers / numbers, std::size_t{1}, kBandRows);
+  }
 
   bool Collect(const FixedVector& point, std::size_t width) {
     return m_sampler.Collect(
