@@ -95,7 +95,12 @@ class GridMaximum {
 
   void MakeBand(std::size_t begin) {
     m_bandBegin = begin;
-    m_bandRows = std::min(m_slab.step.z != 0 ? kBandRows : 1, m_height - begin);
+    // No more than an eighth of the picture, so that its progress can be seen; and rows of few
+    // samples one by one: handed out in bands they would outrun a request to stop.
+    const bool hasBands =
+        m_slab.step.z != 0 && m_width * static_cast<std::size_t>(m_slab.count) >= 4096;
+    const std::size_t most = std::clamp(m_height / 8, std::size_t{1}, kBandRows);
+    m_bandRows = std::min(hasBands ? most : 1, m_height - begin);
     m_band.assign(m_bandRows * m_width, 0);
     if (m_isAcrossRows) {
       RaiseBand();

@@ -32,7 +32,7 @@ class SlabBands {
            std::size_t width) {
     if (index >= m_end) {
       m_begin = index;
-      m_end = index + std::min(BandRows(width), height - index);
+      m_end = index + std::min(BandRows(width, height), height - index);
       // Where one of the rows needs the plain loop, each goes by itself.
       if (!Collect(point, width)) {
         m_end = index + 1;
@@ -52,10 +52,16 @@ class SlabBands {
   static constexpr std::size_t kBandRows = 64;
   static constexpr std::size_t kMostNumbers = std::size_t{1} << 20;  // that a band may take
 
-  // Fewer for rows of very many pixels or layers.
-  std::size_t BandRows(std::size_t width) const {
-    const std::size_t numbers = std::max(width, static_cast<std::size_t>(m_slab.count));
-    return std::clamp(kMostNumbers / numbers, std::size_t{1}, kBandRows);
+  // Fewer for rows of very many pixels or layers, and no more than an eighth of the picture, so
+  // that its progress can be seen. Rows of few samples go one by one: handed out in bands they
+  // would outrun a request to stop.
+  std::size_t BandRows(std::size_t width, std::size_t height) const {
+    const auto layers = static_cast<std::size_t>(m_slab.count);
+    if (width * layers < 4096) {
+      return 1;
+    }
+    return std::clamp(std::min(kMostNumbers / std::max(width, layers), height / 8), std::size_t{1},
+                      kBandRows);
   }
 
   bool Collect(const FixedVector& point, std::size_t width) {
