@@ -230,14 +230,6 @@ void dBuffer::Set(unsigned char value) {
   Set(value * 16843009u);
 }
 
-void* dBuffer::Get(unsigned long offset) const {
-  return offset > m_size || m_data == nullptr ? nullptr : m_data + offset;
-}
-
-unsigned long dBuffer::GetSize() const {
-  return m_size;
-}
-
 unsigned long dBuffer::GetCapacity() const {
   return m_capacity;
 }

@@ -104,9 +104,11 @@ class VORL_API dBuffer : public DataBase {
 
   /// The address of the byte at `offset`; null when `offset` is greater than the size. The size
   /// itself gives the end of the bytes.
-  void* Get(unsigned long offset) const;
+  void* Get(unsigned long offset) const {
+    return offset > m_size || m_data == nullptr ? nullptr : m_data + offset;
+  }
   /// Bytes in use.
-  unsigned long GetSize() const;
+  unsigned long GetSize() const { return m_size; }
   /// Bytes allocated and owned, a multiple of 8; 0 for an empty buffer and for a reference.
   unsigned long GetCapacity() const;
   /// True when the buffer has bytes that belong to someone else.

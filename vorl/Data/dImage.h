@@ -144,8 +144,16 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// The outcome of the last failing or formatting operation.
   const dStatus& GetStatus() const;
 
-  unsigned long GetWidth() const;   ///< pixels
-  unsigned long GetHeight() const;  ///< pixels
+  // What operators ask of every slice of a volume is answered without a call.
+
+  /// Pixels.
+  unsigned long GetWidth() const {
+    return m_rect.width;
+  }
+  /// Pixels.
+  unsigned long GetHeight() const {
+    return m_rect.height;
+  }
   int GetPosX() const;
   int GetPosY() const;
   /// Moves the image rectangle; the size stays.
@@ -174,9 +182,13 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   /// Bits from one row to the next.
   unsigned long GetRowOffset() const;
   /// Bytes from one row to the next.
-  unsigned long GetBytesPerRow() const;
+  unsigned long GetBytesPerRow() const {
+    return m_rowOffset;
+  }
   /// Bytes of the whole image.
-  unsigned long GetImageSize() const;
+  unsigned long GetImageSize() const {
+    return m_buffer.GetSize();
+  }
   /// Samples that fill the image's bytes, padding included.
   unsigned long GetNumDataSamples() const;
   /// Samples that fill a row's bytes, padding included.
@@ -202,7 +214,9 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   const dBuffer& GetDataBuffer() const;
   /// The first byte of the pixels; null when there are none. The pointer accessors do no range
   /// checks; pointers are valid until the image is formatted anew.
-  void* GetDataPtr() const;
+  void* GetDataPtr() const {
+    return m_buffer.Get(0);
+  }
   /// The pixel at (x, y). For 1-bit images the start of the row.
   void* GetDataPtr(int x, int y) const;
   /// The sample of a channel at (x, y).

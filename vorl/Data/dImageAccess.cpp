@@ -17,12 +17,6 @@ const dStatus& dImage::GetStatus() const {
   return m_status;
 }
 
-unsigned long dImage::GetWidth() const {
-  return m_rect.width;
-}
-unsigned long dImage::GetHeight() const {
-  return m_rect.height;
-}
 int dImage::GetPosX() const {
   return m_rect.x;
 }
@@ -78,13 +72,6 @@ unsigned long dImage::GetColumnOffset() const {
 unsigned long dImage::GetRowOffset() const {
   return static_cast<unsigned long>(m_rowOffset) * 8;
 }
-unsigned long dImage::GetBytesPerRow() const {
-  return m_rowOffset;
-}
-unsigned long dImage::GetImageSize() const {
-  return m_buffer.GetSize();
-}
-
 unsigned long dImage::GetNumDataSamples() const {
   return static_cast<unsigned long>(std::uint64_t{m_buffer.GetSize()} * 8 / GetChannelDepth());
 }
@@ -131,10 +118,6 @@ dBuffer& dImage::GetDataBuffer() {
 }
 const dBuffer& dImage::GetDataBuffer() const {
   return m_buffer;
-}
-
-void* dImage::GetDataPtr() const {
-  return m_buffer.Get(0);
 }
 
 void* dImage::GetDataPtr(int x, int y) const {

@@ -2,6 +2,7 @@
 
 #include <vorl/Operators/IP/opMPR.h>
 
+#include <algorithm>
 #include <string>
 
 #include "../../Planes.h"
@@ -13,7 +14,7 @@ using bench::Plane;
 void Reconstruct(benchmark::State& state, const Plane& plane, int algo, int depthSteps) {
   dVolume& volume = bench::Volume();
   dSlice slice;
-  bench::MakePlane(slice, plane, volume);
+  bench::MakePlane(slice, plane, volume, std::max(depthSteps, 16) / 16.0);
   opMPR op;
   op.volume = &volume;
   op.mprSlice = &slice;
@@ -30,11 +31,12 @@ void Reconstruct(benchmark::State& state, const Plane& plane, int algo, int dept
 void Register() {
   const std::pair<const char*, int> algos[] = {{"nearest", MPRAlgo_Nearest},
                                                {"trilinear", MPRAlgo_Trilinear}};
-  for (const int depthSteps : {0, 16}) {
+  for (const int depthSteps : {0, 16, 64}) {
     for (const auto& [algoName, algo] : algos) {
       for (const Plane& plane : bench::kPlanes) {
-        const std::string name = std::string("opMPR/") + (depthSteps != 0 ? "thick16/" : "thin/") +
-                                 algoName + "/" + plane.name;
+        const std::string name = "opMPR/" +
+                                 (depthSteps != 0 ? "thick" + std::to_string(depthSteps) : "thin") +
+                                 "/" + algoName + "/" + plane.name;
         benchmark::RegisterBenchmark(name.c_str(), Reconstruct, plane, algo, depthSteps)
             ->Unit(benchmark::kMicrosecond);
       }

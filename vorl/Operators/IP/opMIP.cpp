@@ -1,17 +1,19 @@
 // 1. Prepare checks the inputs.
 // 2. Process picks the worker for algorithm and data type.
 // 3. The slab workers walk the output rows like a thick reconstruction and keep the largest sample
-//    (RowSampler, Mip.h); the voxel-list worker carries listed voxels into the slice.
+//    (GridMaximum, SlabBands, Mip.h); the voxel-list worker carries listed voxels into the slice.
 
 #include <vorl/Operators/IP/opMIP.h>
 
 #include <algorithm>
 
 #include <vorl/Common/detail/ClassRegistration.h>
+#include <vorl/Operators/IP/kernels/GridMaximum.h>
 #include <vorl/Operators/IP/kernels/Mip.h>
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
 #include <vorl/Operators/IP/kernels/RowSampler.h>
 #include <vorl/Operators/IP/kernels/SamplingCheck.h>
+#include <vorl/Operators/IP/kernels/SlabBands.h>
 #include <vorl/Operators/IP/kernels/VolumeProjection.h>
 
 inline namespace vorl {
@@ -105,9 +107,19 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
   const Sampler sampler(view);
   const vorl_detail::SlicePlane plane(target, source.GetCoordinates(), vorl_detail::kSlabBegin);
   const SlabSamples slab(plane.depthStep, depthSteps);
-  vorl_detail::RowSampler<T> rows(view, algoID == MIPAlgo_Trilinear, vorl_detail::ActiveVariant());
+  const bool isLinear = algoID == MIPAlgo_Trilinear;
+  const auto variant = vorl_detail::ActiveVariant();
+  vorl_detail::RowSampler<T> rows(view, isLinear, variant);
+  const dImage& image = target.GetImage();
+  vorl_detail::GridMaximum<T> grid(view, plane, slab,
+                                   isLinear ? vorl_detail::CpuVariant::Reference : variant,
+                                   image.GetWidth(), image.GetHeight());
+  vorl_detail::SlabBands<T> bands(rows, plane, slab, vorl_detail::RowSink::Maximum,
+                                  m_stopRequested);
+  std::size_t index = 0;
   const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
-    if (rows.Maximum(slab, point, plane.columnStep, pixels, width)) {
+    const std::size_t at = index++;
+    if (grid.Row(at, pixels) || bands.Row(at, image.GetHeight(), point, pixels, width)) {
       point += plane.columnStep.Times(static_cast<std::int32_t>(width));
     } else {
       MipRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);

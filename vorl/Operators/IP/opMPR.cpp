@@ -2,8 +2,8 @@
 // 2. Process picks the worker for algorithm, data type and thickness.
 // 3. A worker carries the output plane into voxel coordinates (SlicePlane), looks at the volume's
 //    pixels through a validated view (VolumeView), and walks the output rows. A row is done by the
-//    kernels of the active variant (RowSampler) or, where those do not apply, by the plain loop
-//    (Mpr.h) with a sampler (Sampling.h).
+//    kernels of the active variant (RowSampler, SlabBands) or, where those do not apply, by the
+//    plain loop (Mpr.h) with a sampler (Sampling.h).
 
 #include <vorl/Operators/IP/opMPR.h>
 
@@ -12,6 +12,7 @@
 #include <vorl/Operators/IP/kernels/PlaneLoop.h>
 #include <vorl/Operators/IP/kernels/RowSampler.h>
 #include <vorl/Operators/IP/kernels/SamplingCheck.h>
+#include <vorl/Operators/IP/kernels/SlabBands.h>
 
 inline namespace vorl {
 
@@ -96,8 +97,11 @@ bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
                                       thick ? vorl_detail::kSlabBegin : 0.0);
   const SlabSamples slab(plane.depthStep, depthSteps);
   vorl_detail::RowSampler<T> rows(view, algoID == MPRAlgo_Trilinear, vorl_detail::ActiveVariant());
+  vorl_detail::SlabBands<T> bands(rows, plane, slab, vorl_detail::RowSink::Sum, m_stopRequested);
+  const std::size_t height = target.GetImage().GetHeight();
+  std::size_t index = 0;
   const auto row = [&](FixedVector& point, T* pixels, std::size_t width) {
-    const bool isDone = thick ? rows.Mean(slab, point, plane.columnStep, pixels, width)
+    const bool isDone = thick ? bands.Row(index++, height, point, pixels, width)
                               : rows.Thin(point, plane.columnStep, pixels, width);
     if (isDone) {
       point += plane.columnStep.Times(static_cast<std::int32_t>(width));

@@ -119,6 +119,24 @@ class Words {
   Words operator&(const Words& other) const { return _mm256_and_si256(m_lanes, other.m_lanes); }
   Words operator|(const Words& other) const { return _mm256_or_si256(m_lanes, other.m_lanes); }
   Words MaxSigned(const Words& other) const { return _mm256_max_epi16(m_lanes, other.m_lanes); }
+  /// The larger lanes, as samples of a type.
+  template <class T>
+  Words Larger(const Words& other) const {
+    if constexpr (static_cast<T>(-1) < 0) {
+      return _mm256_max_epi16(m_lanes, other.m_lanes);
+    } else {
+      return _mm256_max_epu16(m_lanes, other.m_lanes);
+    }
+  }
+  /// The largest unsigned lane.
+  std::uint16_t LargestLane() const {
+    const __m128i eight =
+        _mm_max_epu16(_mm256_castsi256_si128(m_lanes), _mm256_extracti128_si256(m_lanes, 1));
+    // There is an instruction for the smallest one.
+    const __m128i ones = _mm_set1_epi16(-1);
+    const int smallest = _mm_cvtsi128_si32(_mm_minpos_epu16(_mm_xor_si128(eight, ones)));
+    return static_cast<std::uint16_t>(~smallest);
+  }
   /// The high 16 bits of the products of signed lanes.
   Words HighProduct(const Words& other) const { return _mm256_mulhi_epi16(m_lanes, other.m_lanes); }
   bool IsZero() const { return _mm256_testz_si256(m_lanes, m_lanes) != 0; }

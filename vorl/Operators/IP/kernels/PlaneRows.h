@@ -29,6 +29,26 @@ struct PointRange {
 std::optional<PointRange> FindInside(const FixedVector& limits, const FixedVector& point,
                                      const FixedVector& step, std::size_t width);
 
+/// True when all start + i * step, 0 <= i < count, lie in [0, limit) and nothing wraps up to the
+/// one behind them.
+inline bool StaysInside(std::int64_t start, std::int64_t step, std::int64_t count,
+                        std::int64_t limit) {
+  const std::int64_t end = start + step * count;
+  const std::int64_t last = end - step;
+  return start >= 0 && start < limit && last >= 0 && last < limit &&
+         static_cast<std::int32_t>(end) == end;
+}
+
+/// True for rows all of which `FindInside` finds inside, as it does for most: these are not worth a
+/// call. False for some of them, too, that are long.
+inline bool IsRowInside(const FixedVector& limits, const FixedVector& point,
+                        const FixedVector& step, std::size_t width) {
+  const auto count = static_cast<std::int64_t>(width & 0xFFFF);
+  return width - 1 < 0xFFFF && StaysInside(point.x, step.x, count, limits.x) &&
+         StaysInside(point.y, step.y, count, limits.y) &&
+         StaysInside(point.z, step.z, count, limits.z);
+}
+
 /// A volume whose samples are addressed by 32-bit numbers of samples from its first slice.
 class VolumeGrid {
  public:
@@ -66,10 +86,27 @@ enum class RowSink {
 using SampleRun = void(const VolumeGrid& grid, const FixedVector& point, const FixedVector& step,
                        std::size_t count, RowSink sink, void* row);
 
+/// Four rows of voxels.
+struct RowSources {
+  const void* rows[4];
+};
+
+/// Raises a row of `count` samples to those of four rows, and fetches those that come next.
+using RowRaise = void(void* row, const RowSources& sources, const RowSources& next,
+                      std::size_t count);
+
+/// For each of `count` points of one x inside the volume: the largest voxel of its row of voxels in
+/// some ranges of columns, at least 0.
+using RowLargest = void(const VolumeGrid& grid, const FixedVector& point, const FixedVector& step,
+                        std::size_t count, const PointRange* columns, std::size_t ranges,
+                        void* row);
+
 /// One variant of each loop: for unsigned and for signed samples.
 struct PlaneKernels {
   SampleRun* nearest[2];
   SampleRun* linear[2];
+  RowRaise* raiseRow[2];
+  RowLargest* largestInRows[2];
 };
 
 /// The loops of a variant that can run here (see `CanRun`). Null for the reference, which has none:

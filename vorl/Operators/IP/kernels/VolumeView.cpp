@@ -1,8 +1,7 @@
 #include <vorl/Operators/IP/kernels/VolumeView.h>
 
 #include <algorithm>
-
-#include <vorl/Operators/IP/kernels/ImageCheck.h>
+#include <cstdint>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -11,17 +10,36 @@ namespace {
 
 constexpr std::uint64_t kSampleBytes = 2;
 
-// Size and format; rows may be padded otherwise.
-bool IsLikeFirst(const dImage& image, const dImage& first) {
-  return image.GetWidth() == first.GetWidth() && image.GetHeight() == first.GetHeight() &&
-         image.GetFormatID() == first.GetFormatID();
-}
+// What a slice must have in common with slice 0, and how far its pixels must reach. Slices are many
+// and a plane through them is done in little time: each is asked nothing twice.
+class SliceCheck {
+ public:
+  explicit SliceCheck(const dImage& first)
+      : m_width(first.GetWidth()),
+        m_height(first.GetHeight()),
+        m_format(first.GetFormatID()),
+        m_bytesPerRow(first.GetBytesPerRow()) {}
 
-// The bytes from the first pixel to the last one, of an image whose rows are that far apart.
-std::uint64_t RasterBytes(const dImage& image, std::uint64_t bytesPerRow) {
-  const std::uint64_t height = image.GetHeight();
-  return (height > 0 ? bytesPerRow * (height - 1) : 0) + kSampleBytes * image.GetWidth();
-}
+  // Size and format; rows may be padded otherwise. Some kernels walk a slice's own rows, some those
+  // of the first slice: the pixels must suffice for both. `pixels` is where they begin.
+  bool IsGood(const dImage& image, const void* pixels) const {
+    const auto place = reinterpret_cast<std::uintptr_t>(pixels);
+    return image.GetWidth() == m_width && image.GetHeight() == m_height &&
+           image.GetFormatID() == m_format && place != 0 && place % kSampleBytes == 0 &&
+           image.GetImageSize() >= RasterBytes(std::max(image.GetBytesPerRow(), m_bytesPerRow));
+  }
+
+ private:
+  // The bytes from the first pixel to the last one when rows are that far apart.
+  std::uint64_t RasterBytes(std::uint64_t bytesPerRow) const {
+    return (m_height > 0 ? bytesPerRow * (m_height - 1) : 0) + kSampleBytes * m_width;
+  }
+
+  std::uint64_t m_width;
+  std::uint64_t m_height;
+  unsigned long m_format;
+  unsigned long m_bytesPerRow;
+};
 
 }  // namespace
 
@@ -37,18 +55,16 @@ VolumeView::VolumeView(const dVolume& volume)
   const dImage& first = slices.front().GetImage();
   m_pitch = static_cast<std::int32_t>(first.GetDataSamplesPerRow());
 
+  const SliceCheck check(first);
   m_slices.reserve(slices.size() + 2);
   m_slices.push_back(first.GetDataPtr());
   for (const dSlice& slice : slices) {
     const dImage& image = slice.GetImage();
-    // Some kernels walk a slice's own rows, some those of the first slice.
-    const std::uint64_t neededBytes =
-        RasterBytes(image, std::max(image.GetBytesPerRow(), first.GetBytesPerRow()));
-    if (!m_invalidSlice &&
-        !(IsLikeFirst(image, first) && HoldsBytes(image, neededBytes, kSampleBytes))) {
+    const void* const pixels = image.GetDataPtr();
+    if (!m_invalidSlice && !check.IsGood(image, pixels)) {
       m_invalidSlice = static_cast<int>(m_slices.size()) - 1;
     }
-    m_slices.push_back(image.GetDataPtr());
+    m_slices.push_back(pixels);
   }
   m_slices.push_back(m_slices.back());
 }

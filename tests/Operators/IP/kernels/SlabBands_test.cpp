@@ -1,0 +1,189 @@
+// Slabs that are sampled in bands of rows, piece by piece, give the same bits as the plain loops.
+#include <vorl/Operators/IP/kernels/Mip.h>
+#include <vorl/Operators/IP/kernels/Mpr.h>
+#include <vorl/Operators/IP/kernels/SlabBands.h>
+
+#include <gtest/gtest.h>
+
+#include <atomic>
+#include <cstddef>
+#include <cstdint>
+#include <sstream>
+#include <string>
+#include <type_traits>
+#include <vector>
+
+#include "SlabPictures.h"
+
+namespace {
+
+using namespace slab_pictures;
+using vorl_detail::RowSampler;
+using vorl_detail::RowSink;
+using vorl_detail::SlabBands;
+
+class SlabBandVariants : public testing::TestWithParam<CpuVariant> {
+ protected:
+  void SetUp() override {
+    if (!vorl_detail::CanRun(GetParam())) {
+      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
+    }
+  }
+};
+
+INSTANTIATE_TEST_SUITE_P(, SlabBandVariants, testing::Values(CpuVariant::Avx2, CpuVariant::Avx512),
+                         [](const auto& variant) {
+                           return std::string(vorl_detail::NameOf(variant.param));
+                         });
+
+/// Whether a coordinate of the row's slab wraps, so that the plain loop is to do it.
+bool Wraps(const Picture& picture, const FixedVector& start) {
+  const SlabSamples slab(picture.depth, picture.depthSteps);
+  FixedVector point = start;
+  for (std::int32_t k = 0; k < slab.count; ++k, point += slab.step) {
+    if (row_cases::Wraps(point, picture.columnStep, picture.width)) {
+      return true;
+    }
+  }
+  return false;
+}
+
+/// The picture by bands and by the plain loops; rows that the bands leave must be left as they are.
+template <class T, class Sampler>
+void Check(const VolumeView& view, CpuVariant variant, const Picture& picture, RowSink sink,
+           Tally& tally) {
+  constexpr bool kIsLinear = std::is_same_v<Sampler, vorl_detail::TrilinearSampler<T>>;
+  constexpr std::size_t kGuard = 40;
+  constexpr T kMark = 0x5A5A;
+  SCOPED_TRACE(testing::Message() << picture << (kIsLinear ? ", trilinear " : ", nearest ")
+                                  << (sink == RowSink::Sum ? "mean" : "maximum"));
+  const SlabSamples slab(picture.depth, picture.depthSteps);
+  const Sampler sampler(view);
+  const std::atomic<bool> isStopped = false;
+  RowSampler<T> rows(view, kIsLinear, variant);
+  SlabBands<T> bands(rows, PlaneOf(picture), slab, sink, isStopped);
+  FixedVector start = picture.start;
+  for (std::size_t row = 0; row < picture.height; ++row, start += picture.rowStep) {
+    std::vector<T> given(picture.width + 2 * kGuard, kMark);
+    std::vector<T> expected = given;
+    const bool isDone = bands.Row(row, picture.height, start, given.data() + kGuard, picture.width);
+    ++(isDone ? tally.done : tally.left);
+    ASSERT_EQ(isDone, view.Width() >= 2 && !Wraps(picture, start)) << "row " << row;
+    FixedVector point = start;
+    if (isDone && sink == RowSink::Sum) {
+      vorl_detail::MprThickRowRef(view, sampler, slab, point, picture.columnStep,
+                                  expected.data() + kGuard, picture.width);
+    } else if (isDone) {
+      vorl_detail::MipRowRef(view, sampler, slab, point, picture.columnStep,
+                             expected.data() + kGuard, picture.width);
+    }
+    ASSERT_EQ(given, expected) << "row " << row;
+  }
+}
+
+/// Random pictures that `next` makes, in random volumes, in all ways.
+template <class T, class Next>
+void SweepPictures(CpuVariant variant, unsigned seed, int count, Tally& tally, Next&& next) {
+  Sweep<T> sweep(variant, seed);
+  const auto kinds = AllValues<T>();
+  for (int i = 0; i < count && !testing::Test::HasFailure(); ++i) {
+    const Shape shape{sweep.random() % 8 == 0 ? sweep.Between(1, 4) : sweep.Between(2, 140),
+                      sweep.Between(1, 30), sweep.Between(1, 20), sweep.Alignment()};
+    const Values& values = kinds[sweep.random() % kinds.size()];
+    std::ostringstream text;
+    text << vorl_detail::NameOf(variant) << ", seed " << seed << ", "
+         << (std::is_signed_v<T> ? "signed " : "unsigned ") << values << ", " << shape;
+    SCOPED_TRACE(text.str());
+    const GuardedVolume<T> volume(shape, values, sweep.Side(), sweep.random);
+    const Picture picture = next(sweep, shape);
+    for (const RowSink sink : {RowSink::Maximum, RowSink::Sum}) {
+      Check<T, vorl_detail::NearestSampler<T>>(volume.View(), variant, picture, sink, tally);
+      Check<T, vorl_detail::TrilinearSampler<T>>(volume.View(), variant, picture, sink, tally);
+    }
+  }
+}
+
+// More columns than a piece has, more layers, and more rows than a band.
+template <class T>
+struct AnyDirection {
+  static void Run(CpuVariant variant) {
+    Tally tally;
+    SweepPictures<T>(variant, 301, 40, tally, [](Sweep<T>& sweep, const Shape& shape) {
+      const auto step = [&] { return sweep.Between(-kOne, kOne); };
+      Picture picture;
+      picture.width = static_cast<std::size_t>(sweep.Between(0, 3) * 64 + sweep.Between(-2, 2));
+      picture.width = picture.width > 400 ? 1 : picture.width;  // none below 0
+      picture.height = static_cast<std::size_t>(sweep.random() % 4 == 0 ? sweep.Between(63, 130)
+                                                                        : sweep.Between(1, 9));
+      picture.depthSteps = sweep.random() % 3 == 0 ? sweep.Between(15, 50) : sweep.Between(2, 9);
+      picture.start = sweep.Point(shape);
+      picture.columnStep = sweep.random() % 3 == 0 ? FixedVector{kOne, 0, 0}
+                                                   : FixedVector{step(), step() / 8, step() / 16};
+      picture.rowStep = {step() / 4, step() / 2, step() / 4};
+      picture.depth = sweep.Depth(shape);
+      return picture;
+    });
+    EXPECT_GT(tally.done, 10 * tally.left);
+  }
+};
+
+TEST_P(SlabBandVariants, PicturesInAnyDirectionEqualThePlainLoops) {
+  ForBothTypes<AnyDirection>(GetParam());
+}
+
+// Row after row moves on until its end, and then its begin, lies beyond 2^31.
+template <class T>
+struct WrappingRows {
+  static void Run(CpuVariant variant) {
+    Tally tally;
+    SweepPictures<T>(variant, 302, 6, tally, [](Sweep<T>& sweep, const Shape&) {
+      Picture picture;
+      picture.width = 20;
+      picture.height = 90;
+      picture.start = {sweep.Between(0, 5) * kOne, sweep.Fraction(), sweep.Fraction()};
+      picture.columnStep = {kOne / 2, 0, 0};
+      picture.rowStep = {sweep.Between(600, 900) * kOne, 0, 0};
+      picture.depth = {kOne, kOne, 0};
+      return picture;
+    });
+    EXPECT_GT(tally.done, 0);
+    EXPECT_GT(tally.left, 0);
+  }
+};
+
+TEST_P(SlabBandVariants, OnlyRowsThatWrapAreLeftToThePlainLoops) {
+  ForBothTypes<WrappingRows>(GetParam());
+}
+
+TEST_P(SlabBandVariants, AStoppedRowIsLeftAsItIs) {
+  Sweep<std::uint16_t> sweep(GetParam(), 303);
+  const GuardedVolume<std::uint16_t> volume({20, 9, 3}, {1, 500}, GuardPages::Side::Behind,
+                                            sweep.random);
+  const Picture picture{{}, {kOne, 0, 0}, {0, kOne, 0}, {0, 0, kOne}, 3, 20, 9};
+  std::atomic<bool> isStopped = true;
+  RowSampler<std::uint16_t> rows(volume.View(), false, GetParam());
+  SlabBands<std::uint16_t> bands(rows, PlaneOf(picture), SlabSamples(picture.depth, 3),
+                                 RowSink::Maximum, isStopped);
+  std::vector<std::uint16_t> pixels(picture.width, 0x5A5A);
+  EXPECT_TRUE(bands.Row(0, picture.height, picture.start, pixels.data(), picture.width));
+  EXPECT_EQ(pixels, std::vector<std::uint16_t>(picture.width, 0x5A5A));
+}
+
+TEST_P(SlabBandVariants, SlabsOfFarMoreLayersThanVoxelsAreLeftToThePlainLoops) {
+  Sweep<std::uint16_t> sweep(GetParam(), 304);
+  const GuardedVolume<std::uint16_t> volume({20, 9, 3}, {1, 500}, GuardPages::Side::Behind,
+                                            sweep.random);
+  const std::atomic<bool> isStopped = false;
+  RowSampler<std::uint16_t> rows(volume.View(), false, GetParam());
+  for (const bool isTooMany : {false, true}) {
+    const std::int32_t layers = isTooMany ? 65537 : 65536;
+    const Picture picture{{}, {kOne, 0, 0}, {0, kOne, 0}, {0, 0, kOne}, layers, 2, 2};
+    SlabBands<std::uint16_t> bands(rows, PlaneOf(picture), SlabSamples(picture.depth, layers),
+                                   RowSink::Maximum, isStopped);
+    std::vector<std::uint16_t> pixels(picture.width);
+    EXPECT_EQ(bands.Row(0, picture.height, picture.start, pixels.data(), picture.width),
+              !isTooMany);
+  }
+}
+
+}  // namespace
