@@ -6,6 +6,7 @@
 #include <vorl/Data/dDIB.h>
 #include <vorl/IO/File/opDIB2Ima.h>
 
+#include <CLI/CLI.hpp>
 #include <cstdlib>
 #include <cstring>
 #include <fstream>

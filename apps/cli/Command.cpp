@@ -13,6 +13,14 @@ Command::Command(CLI::App& application, const CommandText& text)
       ->group(kGeneralGroup);
 }
 
+bool Command::IsChosen() const {
+  return m_app->parsed();
+}
+
+std::string Command::GetName() const {
+  return m_app->get_name();
+}
+
 CLI::Option* AddText(CLI::App& command, const std::string& names, std::string& target,
                      const std::string& type, const std::string& description,
                      const std::string& group) {

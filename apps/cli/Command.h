@@ -6,13 +6,16 @@
 
 #include <cli/Console.h>
 
-#include <CLI/CLI.hpp>
-
 #include <initializer_list>
 #include <memory>
 #include <stdexcept>
 #include <string>
 #include <utility>
+
+namespace CLI {
+class App;
+class Option;
+}  // namespace CLI
 
 namespace cli {
 
@@ -49,8 +52,8 @@ class Command {
   Command& operator=(const Command&) = delete;
 
   /// True when the command line names this command.
-  bool IsChosen() const { return m_app->parsed(); }
-  std::string GetName() const { return m_app->get_name(); }
+  bool IsChosen() const;
+  std::string GetName() const;
   bool IsQuiet() const { return m_quiet; }
   /// Looks at everything that can be judged without opening a file. Throws `UsageError`.
   virtual void Check() = 0;

@@ -4,9 +4,11 @@
 /// @file
 /// The option that says how a volume is sampled between its voxels.
 
-#include <CLI/CLI.hpp>
-
 #include <string>
+
+namespace CLI {
+class App;
+}  // namespace CLI
 
 namespace cli {
 

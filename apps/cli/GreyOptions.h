@@ -8,9 +8,11 @@
 #include <cli/Render.h>
 #include <cli/Windows.h>
 
-#include <CLI/CLI.hpp>
-
 #include <string>
+
+namespace CLI {
+class App;
+}  // namespace CLI
 
 namespace cli {
 

@@ -4,6 +4,7 @@
 #include <study/LoadStudy.h>
 #include <study/Phantom.h>
 
+#include <CLI/CLI.hpp>
 #include <filesystem>
 
 namespace cli {

@@ -8,11 +8,13 @@
 #include <study/LoadReport.h>
 #include <study/Study.h>
 
-#include <CLI/CLI.hpp>
-
 #include <memory>
 #include <string>
 #include <vector>
+
+namespace CLI {
+class App;
+}  // namespace CLI
 
 namespace cli {
 

@@ -6,6 +6,7 @@
 #include <study/Phantom.h>
 #include <study/StudyFile.h>
 
+#include <CLI/CLI.hpp>
 #include <array>
 #include <filesystem>
 #include <utility>

@@ -6,10 +6,12 @@
 
 #include <vorl/Data/dImage.h>
 
-#include <CLI/CLI.hpp>
-
 #include <filesystem>
 #include <string>
+
+namespace CLI {
+class App;
+}  // namespace CLI
 
 namespace cli {
 

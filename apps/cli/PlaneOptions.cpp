@@ -2,6 +2,7 @@
 #include <cli/PlaneOptions.h>
 #include <cli/Values.h>
 
+#include <CLI/CLI.hpp>
 #include <array>
 #include <utility>
 
@@ -34,6 +35,10 @@ void PlaneOptions::AddTo(CLI::App& command, const PlaneHelp& help) {
   AddText(command, "--rotate", m_rotation, "X,Y,Z", help.rotation, help.group);
   AddText(command, "--size", m_size, "WxH", help.size, help.group);
   AddText(command, "--spacing", m_spacing, "MM", help.spacing, help.group);
+}
+
+bool PlaneOptions::NamesPlane() const {
+  return m_planeOption->count() > 0;
 }
 
 std::string PlaneOptions::FirstGiven() const {

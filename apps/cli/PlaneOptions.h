@@ -6,9 +6,12 @@
 
 #include <study/Planes.h>
 
-#include <CLI/CLI.hpp>
-
 #include <string>
+
+namespace CLI {
+class App;
+class Option;
+}  // namespace CLI
 
 namespace cli {
 
@@ -37,7 +40,7 @@ class PlaneOptions {
   /// True when --plane or --rotate stands on the command line.
   bool NamesDirection() const { return NamesPlane() || !m_rotation.empty(); }
   /// True when --plane does.
-  bool NamesPlane() const { return m_planeOption->count() > 0; }
+  bool NamesPlane() const;
   /// The first of the options that stands on the command line, such as "--size"; else empty.
   std::string FirstGiven() const;
   /// The texts as values; what is not given is as in a new request. Throws `UsageError`.

@@ -6,6 +6,7 @@
 #include <cli/Sheet.h>
 #include <cli/Values.h>
 
+#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <cmath>
 #include <optional>
