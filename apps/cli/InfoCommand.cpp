@@ -64,8 +64,9 @@ std::string SliceKind(const study::Study& study) {
 std::string SeriesLines(const study::LoadReport& report) {
   std::string text;
   for (std::size_t i = 0; i < report.series.size(); ++i) {
-    text += Line(i == report.chosen ? "Series:" : "Also there:",
-                 "#" + std::to_string(i + 1) + " " + study::SeriesText(report.series[i]));
+    text +=
+        Line(i == report.chosen ? "Series:" : "Also there:",
+             std::string("#") + std::to_string(i + 1) + " " + study::SeriesText(report.series[i]));
   }
   return text;
 }
@@ -90,9 +91,9 @@ std::string GeometryLines(const study::Study& study) {
                                      0.5 * volume.GetSizeZ()})) +
                              " mm") +
          Line("Orientation:", SliceKind(study)) +
-         Line("", "rows run to " + DirectionText(place.axisX)) +
-         Line("", "columns run to " + DirectionText(place.axisY)) +
-         Line("", "slices follow to " + DirectionText(place.axisZ));
+         Line("", std::string("rows run to ") + DirectionText(place.axisX)) +
+         Line("", std::string("columns run to ") + DirectionText(place.axisY)) +
+         Line("", std::string("slices follow to ") + DirectionText(place.axisZ));
 }
 
 std::string ValueLines(const study::Study& study, const StoredRange& range) {
@@ -108,7 +109,7 @@ std::string ValueLines(const study::Study& study, const StoredRange& range) {
                                     study)) +
       Line("Unit:", study.unit.empty() ? "none" : study.unit);
   if (study.windowWidth > 0) {
-    text += Line("Window:", "centre " + NumberText(study.windowCentre) + ", width " +
+    text += Line("Window:", std::string("centre ") + NumberText(study.windowCentre) + ", width " +
                                 NumberText(study.windowWidth));
   }
   return text;
