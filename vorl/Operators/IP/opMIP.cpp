@@ -124,6 +124,7 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
     } else {
       MipRowRef(view, sampler, slab, point, plane.columnStep, pixels, width);
     }
+    return !bands.HasLeftRow();
   };
   vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
   return true;

@@ -110,6 +110,7 @@ bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
     } else {
       MprThinRowRef(view, sampler, point, plane.columnStep, pixels, width);
     }
+    return !bands.HasLeftRow();
   };
   vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
   return true;

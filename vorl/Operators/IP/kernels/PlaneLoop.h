@@ -25,8 +25,9 @@ bool ForEachPlaneRow(const RunControl& control, const dSlice& slice, const Slice
       plane.rowStep - plane.columnStep.Times(static_cast<std::int32_t>(image.GetWidth()));
   FixedVector point = plane.start;
   return ForEachRow(control, image.GetHeight(), [&](std::size_t index) {
-    row(point, RowOf<T>(image, index), width);
+    const bool isDone = DoRow(row, point, RowOf<T>(image, index), width);
     point += toNextRow;
+    return isDone;
   });
 }
 

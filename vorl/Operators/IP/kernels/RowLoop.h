@@ -6,6 +6,7 @@
 
 #include <atomic>
 #include <cstddef>
+#include <type_traits>
 
 #include <vorl/Data/dImage.h>
 
@@ -18,9 +19,20 @@ struct RunControl {
   std::atomic<double>& progress;
 };
 
+/// Calls `row(arguments)`. False when it returns false; a row that returns nothing is done.
+template <class Row, class... Arguments>
+bool DoRow(Row& row, Arguments&&... arguments) {
+  if constexpr (std::is_same_v<std::invoke_result_t<Row&, Arguments...>, bool>) {
+    return row(arguments...);
+  } else {
+    row(arguments...);
+    return true;
+  }
+}
+
 /// Calls `row(i)` for i = 0 .. count - 1. A stop request is honoured before each row, progress
-/// stored once after each; where there are no rows, all is done at once. Returns false when
-/// stopped.
+/// stored once after each; where there are no rows, all is done at once. A row that returns false
+/// was itself stopped on the way, and does not count. Returns false when stopped.
 ///
 /// Progress is seen before the next request is looked for: whoever asks to stop and then for the
 /// progress sees at most one more row done, however short rows are.
@@ -33,7 +45,9 @@ bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
     if (control.stopRequested.load(std::memory_order_seq_cst)) {
       return false;
     }
-    row(i);
+    if (!DoRow(row, i)) {
+      return false;
+    }
     control.progress.store(static_cast<double>(i + 1) / static_cast<double>(count),
                            std::memory_order_seq_cst);
   }

@@ -27,7 +27,7 @@ class SlabBands {
 
   /// Fills the pixels of row `index` of `height`, which begins at `point`; rows come in order.
   /// False, and nothing is done, for a row that needs the plain loop. When stopped, the row may be
-  /// left as it is.
+  /// left as it is; then `HasLeftRow`.
   bool Row(std::size_t index, std::size_t height, const FixedVector& point, T* pixels,
            std::size_t width) {
     if (index >= m_end) {
@@ -42,11 +42,15 @@ class SlabBands {
       }
     }
     if (m_stopRequested.load(std::memory_order_relaxed)) {
+      m_hasLeftRow = true;
       return true;
     }
     return m_sink == RowSink::Sum ? m_sampler.StoreMean(index - m_begin, pixels)
                                   : m_sampler.StoreMaximum(index - m_begin, pixels);
   }
+
+  /// True when the last row was left as it was, because the operator is to stop.
+  bool HasLeftRow() const { return m_hasLeftRow; }
 
  private:
   static constexpr std::size_t kBandRows = 64;
@@ -77,6 +81,7 @@ class SlabBands {
   const std::atomic<bool>& m_stopRequested;
   std::size_t m_begin = 0;
   std::size_t m_end = 0;
+  bool m_hasLeftRow = false;
 };
 
 }  // namespace vorl_detail
