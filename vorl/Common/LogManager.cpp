@@ -150,11 +150,6 @@ unsigned long LogThread::GetLogDepth() const {
 void LogThread::Push(LogContext* context) {
   const KillShield shield;
   const std::lock_guard lock(m_stackMutex);
-  if (!m_spare.empty()) {
-    m_stack.splice(m_stack.begin(), m_spare, m_spare.begin());
-    m_stack.front() = context;
-    return;
-  }
   try {
     m_stack.push_front(context);
   } catch (const std::bad_alloc&) {
@@ -169,7 +164,7 @@ bool LogThread::Remove(LogContext* context) {
     m_stack.remove(context);  // ended out of order: it must not stay behind as a dangling pointer
     return false;
   }
-  m_spare.splice(m_spare.begin(), m_stack, m_stack.begin());
+  m_stack.pop_front();
   return true;
 }
 

@@ -100,7 +100,6 @@ class VORL_API LogThread {
   std::uint32_t m_id;
   double m_baseTime;
   std::list<LogContext*> m_stack;
-  std::list<LogContext*> m_spare;  // places that contexts have left, for the next ones
   LogSession* m_session;
   mutable std::mutex m_stackMutex;  // operators log from their own threads
 };
