@@ -11,7 +11,7 @@
 
 using Bytes = std::vector<unsigned char>;
 
-/// An image that notes its hooks and opens its protected helpers.
+/// An image that notes its hooks and opens what is protected.
 class HookedImage : public dImage {
  public:
   using dImage::AllocateDataBuffer;
