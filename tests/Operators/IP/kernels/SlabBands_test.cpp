@@ -1,6 +1,7 @@
 // Slabs that are sampled in bands of rows, piece by piece, give the same bits as the plain loops.
 #include <vorl/Operators/IP/kernels/Mip.h>
 #include <vorl/Operators/IP/kernels/Mpr.h>
+#include <vorl/Operators/IP/kernels/RowLoop.h>
 #include <vorl/Operators/IP/kernels/SlabBands.h>
 
 #include <gtest/gtest.h>
@@ -167,6 +168,15 @@ TEST_P(SlabBandVariants, AStoppedRowIsLeftAsItIs) {
   std::vector<std::uint16_t> pixels(picture.width, 0x5A5A);
   EXPECT_TRUE(bands.Row(0, picture.height, picture.start, pixels.data(), picture.width));
   EXPECT_EQ(pixels, std::vector<std::uint16_t>(picture.width, 0x5A5A));
+  EXPECT_TRUE(bands.HasLeftRow());
+}
+
+TEST(RowLoop, ARowThatWasStoppedOnTheWayDoesNotCount) {
+  const std::atomic<bool> isStopped = false;
+  std::atomic<double> progress = 0.0;
+  const auto untilThird = [](std::size_t index) { return index < 2; };
+  EXPECT_FALSE(vorl_detail::ForEachRow({isStopped, progress}, 4, untilThird));
+  EXPECT_EQ(progress, 0.5);
 }
 
 TEST_P(SlabBandVariants, SlabsOfFarMoreLayersThanVoxelsAreLeftToThePlainLoops) {
