@@ -65,7 +65,8 @@ ProgressBar::ProgressBar(bool wanted) : m_enabled(wanted && IsTerminal()) {}
 
 void ProgressBar::Show(double fraction, const std::string& what) {
   const Clock::time_point now = Clock::now();
-  if (!m_enabled || (!m_shown.empty() && now - m_shownAt < kPause)) {
+  const bool isRecent = !m_shown.empty() && what == m_what && now - m_shownAt < kPause;
+  if (!m_enabled || isRecent) {
     return;
   }
   const std::string text = ProgressText(fraction, what, TerminalColumns());
@@ -74,6 +75,7 @@ void ProgressBar::Show(double fraction, const std::string& what) {
   }
   const std::size_t leftOver = m_shown.size() > text.size() ? m_shown.size() - text.size() : 0;
   Write(std::string(1, '\r').append(text).append(leftOver, ' '));
+  m_what = what;
   m_shown = text;
   m_shownAt = now;
 }

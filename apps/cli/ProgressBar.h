@@ -19,7 +19,8 @@ class ProgressBar {
   ProgressBar(const ProgressBar&) = delete;
   ProgressBar& operator=(const ProgressBar&) = delete;
 
-  /// Draws the bar, unless it was drawn a moment ago. `fraction` is from 0 to 1.
+  /// Draws the bar, unless it was drawn a moment ago with the same `what`: work that is over soon
+  /// is named all the same. `fraction` is from 0 to 1.
   void Show(double fraction, const std::string& what);
   /// Takes the bar away, so that other text can be written.
   void Clear();
@@ -28,6 +29,7 @@ class ProgressBar {
   using Clock = std::chrono::steady_clock;
 
   bool m_enabled;
+  std::string m_what;
   std::string m_shown;
   Clock::time_point m_shownAt{};
 };

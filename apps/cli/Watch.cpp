@@ -24,6 +24,7 @@ void CheckStatus(const OpBase& op, const std::string& what) {
 }
 
 void RunWatched(OpBase& op, const study::Progress& progress, const std::string& doing) {
+  study::Report(progress, 0, doing);  // also where the operator is faster than the first look
   if (!op.RunAsThread(0)) {
     op.Run();
     return;

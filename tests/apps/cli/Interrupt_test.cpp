@@ -96,7 +96,6 @@ TEST(Interrupt, WhileAPlaneIsCutEndsTheRun) {
   EXPECT_TRUE(folder.Names().empty());
 }
 
-// Edges, and many voxels: counting must outlast the pause between two pictures of the bar.
 TEST(Interrupt, WhileVoxelsAreCountedEndsTheRun) {
   const TestFolder folder;
   const Outcome outcome =
