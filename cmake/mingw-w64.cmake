@@ -7,7 +7,7 @@ set(CMAKE_CXX_COMPILER x86_64-w64-mingw32-g++-posix)
 set(CMAKE_RC_COMPILER x86_64-w64-mingw32-windres)
 
 # Libraries and headers are the target's, programs that run during the build are this machine's.
-# scripts/test-windows.sh puts what the target lacks into the first folder.
+# scripts/windows-libraries.sh puts what the target lacks into the first folder.
 get_filename_component(vorl_windows_libraries
   ${CMAKE_CURRENT_LIST_DIR}/../build/windows-deps/prefix ABSOLUTE)
 set(CMAKE_FIND_ROOT_PATH ${vorl_windows_libraries} /usr/x86_64-w64-mingw32)
