@@ -111,7 +111,8 @@ TEST(DataOutOfMemory, BitmapThatCannotBeDescribedTellsWhy) {
     EXPECT_STREQ(dImaDescriptorDIB(good).GetStatus(), text);
   }
   EXPECT_STREQ(descriptor.GetStatus(), text);
-  EXPECT_EQ(log.errors, std::vector<std::string>{std::string("dImaDescriptorDIB::Init: ") + text});
+  ASSERT_EQ(log.errors.size(), 1U);
+  EXPECT_EQ(log.errors[0], std::string("dImaDescriptorDIB::Init: ").append(text));
   EXPECT_EQ(descriptor.GetHeader(), nullptr);
 }
 

@@ -52,6 +52,16 @@ TEST(Progress, ATerminalShowsABarThatGoesAway) {
   EXPECT_EQ(Visible(outcome.errors), "");
 }
 
+TEST(Progress, WorkThatIsOverAtOnceIsNamedAllTheSame) {
+  const TestFolder folder;
+  const Outcome outcome =
+      RunTool({"mpr", "--phantom=16x16x16", "-o", (folder / "a.png").string()}, Terminal(80));
+  for (const char* const work :
+       {"making the phantom", "cutting the plane", "making the picture", "writing the picture"}) {
+    EXPECT_NE(outcome.errors.find(work), std::string::npos) << work;
+  }
+}
+
 TEST(Progress, OnlyTheResultIsLeftOnATerminal) {
   const Outcome piped = RunTool({"info", "--phantom=32x32x32"});
   const Outcome shown = RunTool({"info", "--phantom=32x32x32"}, Terminal(200));
