@@ -4,27 +4,17 @@
 #include <gtest/gtest.h>
 
 #include <cstdint>
-#include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <string>
 #include <vector>
 
+#include "../Support/TestFolder.h"
 #include "ImageTesting.h"
 
 /// A file of its own for each test, gone with it.
 class ImageFile : public testing::Test {
  protected:
-  void SetUp() override {
-    const auto* info = testing::UnitTest::GetInstance()->current_test_info();
-    m_folder = std::filesystem::path(testing::TempDir()) /
-               (std::string("vorl_") + info->test_suite_name() + "_" + info->name());
-    std::filesystem::remove_all(m_folder);
-    std::filesystem::create_directories(m_folder);
-    m_path = (m_folder / "image.bdf").string();
-  }
-  void TearDown() override { std::filesystem::remove_all(m_folder); }
-
   void Store(const Bytes& bytes) const {
     std::ofstream file(m_path, std::ios::binary | std::ios::trunc);
     file.write(reinterpret_cast<const char*>(bytes.data()),
@@ -36,8 +26,8 @@ class ImageFile : public testing::Test {
     return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
   }
 
-  std::filesystem::path m_folder;
-  std::string m_path;
+  const TestFolder m_folder;
+  const std::string m_path = (m_folder / "image.bdf").string();
 };
 
 /// What an image file of the type "dImage" holds, item by item, as it stands in the file.

@@ -6,24 +6,19 @@
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
-#include <filesystem>
 #include <fstream>
 #include <string>
+
+#include "../Support/TestFolder.h"
 
 /// Holds ten digits, unless a test writes something else.
 class TextFile : public testing::Test {
  protected:
-  void SetUp() override {
-    std::string name = testing::UnitTest::GetInstance()->current_test_info()->name();
-    std::replace(name.begin(), name.end(), '/', '_');
-    m_path = (std::filesystem::path(testing::TempDir()) / ("vorl_text_" + name)).string();
-    Write("0123456789");
-  }
-  void TearDown() override { std::filesystem::remove_all(m_path); }
+  TextFile() { Write("0123456789"); }
   void Write(const std::string& text) { std::ofstream(m_path, std::ios::binary) << text; }
 
-  std::string m_path;
+  const TestFolder m_folder;
+  const std::string m_path = (m_folder / "text").string();
 };
 
 #endif

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "../Support/LogRecorder.h"
+#include "../Support/TestFolder.h"
 #include "BitmapTesting.h"
 #if defined(__linux__)
 #include "../apps/FileSizeLimit.h"
@@ -22,22 +23,13 @@ namespace fs = std::filesystem;
 
 class dImaDescriptorDIBFile : public testing::Test {
  protected:
-  void SetUp() override {
-    const auto* info = testing::UnitTest::GetInstance()->current_test_info();
-    m_folder = fs::path(testing::TempDir()) / (std::string("vorl_dib_") + info->name());
-    fs::remove_all(m_folder);
-    fs::create_directories(m_folder);
-    m_path = (m_folder / "picture.bmp").string();
-  }
-  void TearDown() override { fs::remove_all(m_folder); }
-
   std::vector<unsigned char> FileBytes() const {
     std::ifstream file(m_path, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>()};
   }
 
-  fs::path m_folder;
-  std::string m_path;
+  const TestFolder m_folder;
+  const std::string m_path = (m_folder / "picture.bmp").string();
 };
 
 unsigned U16At(const std::vector<unsigned char>& bytes, std::size_t offset) {

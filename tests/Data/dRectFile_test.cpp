@@ -2,18 +2,17 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdio>
 #include <fstream>
 #include <iterator>
 #include <string>
+
+#include "../Support/TestFolder.h"
 
 namespace {
 
 /// A file that is gone after the test.
 class dRectFile : public ::testing::Test {
  protected:
-  ~dRectFile() override { std::remove(Name()); }
-
   const char* Name() const { return m_name.c_str(); }
   std::string Bytes() const {
     std::ifstream file(m_name, std::ios::binary);
@@ -21,8 +20,8 @@ class dRectFile : public ::testing::Test {
   }
 
  private:
-  std::string m_name = ::testing::TempDir() + "dRectFile_" +
-                       ::testing::UnitTest::GetInstance()->current_test_info()->name() + ".bdf";
+  const TestFolder m_folder;
+  const std::string m_name = (m_folder / "rect.bdf").string();
 };
 
 TEST_F(dRectFile, HoldsSignedPositionThenUnsignedSize) {

@@ -8,15 +8,15 @@
 #include <algorithm>
 #include <cstdint>
 #include <cstdio>
-#include <filesystem>
 #include <fstream>
 #include <functional>
 #include <initializer_list>
 #include <iterator>
-#include <random>
 #include <string>
 #include <utility>
 #include <vector>
+
+#include "../Support/TestFolder.h"
 
 using Bytes = std::vector<unsigned char>;
 
@@ -28,18 +28,6 @@ inline Bytes operator+(Bytes a, const Bytes& b) {
 /// A test with a file of its own, removed at the end.
 class BinaryFileTest : public testing::Test {
  protected:
-  BinaryFileTest() {
-    const testing::TestInfo* const test = testing::UnitTest::GetInstance()->current_test_info();
-    std::string name = std::string("vorl_") + test->test_suite_name() + "_" + test->name() + "_" +
-                       std::to_string(std::random_device()());
-    std::replace(name.begin(), name.end(), '/', '_');  // of tests with parameters
-    m_path = (std::filesystem::temp_directory_path() / name).string();
-  }
-  ~BinaryFileTest() override {
-    std::error_code ignored;
-    std::filesystem::remove_all(m_path, ignored);
-  }
-
   const char* FileName() const { return m_path.c_str(); }
 
   void MakeFile(const Bytes& bytes) const {
@@ -76,7 +64,8 @@ class BinaryFileTest : public testing::Test {
     return ItemBytes();
   }
 
-  std::string m_path;
+  const TestFolder m_folder;
+  const std::string m_path = (m_folder / "file").string();
 };
 
 /// The code of the status that `action` throws; 0 when it throws nothing.

@@ -1,6 +1,7 @@
 // Which font a description finds, how its characters are made, and what is kept of them. Where the
 // installed fonts decide, relations are tested; a process of its own sees one font alone.
 
+#include "../Support/TestFolder.h"
 #include "DeviceTesting.h"
 
 #include <vorl/Platform/soft/FontFace.h>
@@ -17,7 +18,6 @@
 #include <fstream>
 #include <iterator>
 #include <memory>
-#include <random>
 #include <set>
 #include <string>
 
@@ -266,10 +266,9 @@ bool Holds(bool condition, const char* text) {
 }
 
 // What the font lacks is made of what it has.
-[[noreturn]] void UseOneFont() {
-  const fs::path folder = fs::path(testing::TempDir()) /
-                          (std::string("vorl-one-font-") + std::to_string(std::random_device()()));
-  const int unitsPerEm = InstallOneFont(folder);
+bool UsesOneFont() {
+  const TestFolder folder;
+  const int unitsPerEm = InstallOneFont(folder.Path());
   bool isGood = Holds(unitsPerEm > 0, "a font is found");
   isGood &= Holds(InkOf(Description(-60, FW_BOLD), U'I') > InkOf(Description(-60), U'I') * 11 / 10,
                   "bold strokes are thicker");
@@ -293,13 +292,12 @@ bool Holds(bool condition, const char* text) {
                   "lines have their gap when it is asked for");
   SelectObject(s.dc, old);
   DeleteObject(font);
-  fs::remove_all(folder);
-  std::exit(isGood ? 0 : 1);
+  return isGood;
 }
 
 TEST(DeviceFonts, WhatAFontLacksIsMadeOfWhatItHas) {
   GTEST_FLAG_SET(death_test_style, "threadsafe");  // a new process, in which no font is open yet
-  EXPECT_EXIT(UseOneFont(), testing::ExitedWithCode(0), "");
+  EXPECT_EXIT(std::exit(UsesOneFont() ? 0 : 1), testing::ExitedWithCode(0), "");
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 // Text: its encoding, its lines, its measures. Lengths are compared with each other, not with
 // numbers, because fonts differ from machine to machine.
 
+#include "../Support/TestFolder.h"
 #include "DeviceTesting.h"
 
 #include <vorl/Platform/soft/FontFace.h>
@@ -258,24 +259,24 @@ TEST(DeviceText, ThreadsMeasureAtTheSameTime) {
   EXPECT_EQ(together, alone);
 }
 
-// Fontconfig is told of no fonts; 0 when text then has no size and draws nothing.
-[[noreturn]] void DrawWithoutFonts() {
-  const std::string file = testing::TempDir() + "no-fonts.conf";
+// Fontconfig is told of no fonts; true when text then has no size and draws nothing.
+bool DrawsNothingWithoutFonts() {
+  const TestFolder folder;
+  const std::string file = (folder / "no-fonts.conf").string();
   std::ofstream(file) << "<fontconfig></fontconfig>\n";
   setenv("FONTCONFIG_FILE", file.c_str(), 1);
   const TestSection s(8, 8, 32);
   SetBkColor(s.dc, RGB(255, 255, 255));
   RECT rect{2, 3, 8, 8};
-  const bool isNothing = DrawTextA(s.dc, "ab\ncd", -1, &rect, 0) == 0 && s.At(3, 4) == 0 &&
-                         DrawTextA(s.dc, "", -1, &rect, 0) == 0 &&
-                         DrawTextA(s.dc, "ab c", -1, &rect, DT_CALCRECT | DT_WORDBREAK) == 0 &&
-                         rect.right == 2 && rect.bottom == 3;
-  std::exit(isNothing ? 0 : 1);
+  return DrawTextA(s.dc, "ab\ncd", -1, &rect, 0) == 0 && s.At(3, 4) == 0 &&
+         DrawTextA(s.dc, "", -1, &rect, 0) == 0 &&
+         DrawTextA(s.dc, "ab c", -1, &rect, DT_CALCRECT | DT_WORDBREAK) == 0 && rect.right == 2 &&
+         rect.bottom == 3;
 }
 
 TEST(DeviceText, WithoutFontsNothingIsDrawn) {
   GTEST_FLAG_SET(death_test_style, "threadsafe");  // a new process, in which no font is open yet
-  EXPECT_EXIT(DrawWithoutFonts(), testing::ExitedWithCode(0), "");
+  EXPECT_EXIT(std::exit(DrawsNothingWithoutFonts() ? 0 : 1), testing::ExitedWithCode(0), "");
 }
 
 }  // namespace

@@ -4,9 +4,10 @@
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
 #include <string>
 #include <vector>
+
+#include "../Support/TestFolder.h"
 
 namespace {
 
@@ -22,11 +23,6 @@ unsigned char ByteAt(std::size_t position) {
 // A file of so many bytes behind a head, none like its neighbours.
 class FileRows : public testing::Test {
  protected:
-  void TearDown() override {
-    m_file.reset();
-    std::filesystem::remove(m_path);
-  }
-
   void MakeFile(std::size_t bytes) {
     m_file.reset(vorl_detail::OpenFileForWriting(m_path.c_str()));
     ASSERT_NE(m_file, nullptr);
@@ -56,7 +52,8 @@ class FileRows : public testing::Test {
     ASSERT_EQ(memory, expected);
   }
 
-  std::string m_path = testing::TempDir() + "vorl_file_rows.tmp";
+  const TestFolder m_folder;
+  const std::string m_path = (m_folder / "rows").string();
   FileHandle m_file;
 };
 

@@ -2,52 +2,20 @@
 #define VORL_TESTS_APPS_TESTFOLDER_H
 
 /// @file
-/// A folder of its own for a test.
+/// The files in a test's folder.
 
-#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <random>
 #include <string>
-#include <vector>
+
+#include "../Support/TestFolder.h"
 
 namespace study_test {
 
 namespace fs = std::filesystem;
 
-/// An empty folder that is removed with all its content.
-class TestFolder {
- public:
-  TestFolder() {
-    std::random_device random;
-    do {
-      m_path = fs::temp_directory_path() / ("vorl-test-" + std::to_string(random()));
-    } while (!fs::create_directory(m_path));  // throws where there can be none
-  }
-  ~TestFolder() {
-    std::error_code ignored;
-    fs::remove_all(m_path, ignored);
-  }
-  TestFolder(const TestFolder&) = delete;
-  TestFolder& operator=(const TestFolder&) = delete;
-
-  const fs::path& Path() const { return m_path; }
-  fs::path operator/(const std::string& name) const { return m_path / name; }
-
-  /// The names in the folder, sorted.
-  std::vector<std::string> Names() const {
-    std::vector<std::string> names;
-    for (const auto& entry : fs::directory_iterator(m_path)) {
-      names.push_back(entry.path().filename().string());
-    }
-    std::sort(names.begin(), names.end());
-    return names;
-  }
-
- private:
-  fs::path m_path;
-};
+using ::TestFolder;
 
 inline std::string ReadBytes(const fs::path& path) {
   std::ifstream file(path, std::ios::binary);
