@@ -14,5 +14,5 @@ build windows
 folder="$PWD/build/windows/vorl"
 export WINEPATH="Z:${folder//\//\\}"
 step "Testing the preset 'windows'"
-ctest --preset windows --parallel "$jobs" --output-on-failure
+ctest --preset windows --parallel "$test_jobs" --output-on-failure
 step 'All tests passed under Wine'
