@@ -13,6 +13,5 @@ build windows
 # Wine finds the DLL of the library as Windows would find it in PATH.
 folder="$PWD/build/windows/vorl"
 export WINEPATH="Z:${folder//\//\\}"
-step "Testing the preset 'windows'"
-ctest --preset windows --parallel "$test_jobs" --output-on-failure
+run_tests windows
 step 'All tests passed under Wine'
