@@ -4,6 +4,7 @@
 #include <study/StudyFile.h>
 
 #include <cstdio>
+#include <random>
 
 namespace cli_test {
 
@@ -59,6 +60,25 @@ Picture CutFixture::CutPicture(Arguments arguments) const {
   arguments.insert(arguments.end(), {"-o", path});
   Cut(arguments);
   return ReadPng(path);
+}
+
+SmallVolume::SmallVolume(const std::array<int, 3>& size, double sliceStep, unsigned seed,
+                         int lowest, int count)
+    : m_size(size), m_sliceStep(sliceStep) {
+  std::mt19937 random(seed);
+  m_values.resize(static_cast<std::size_t>(size[0] * size[1] * size[2]));
+  for (int& value : m_values) {
+    value = lowest + static_cast<int>(random() % static_cast<unsigned>(count));
+  }
+  Write();
+}
+
+VolumeModel SmallVolume::Model() const {
+  VolumeModel model;
+  model.size = m_size;
+  model.step = {Point{1, 0, 0}, Point{0, 1, 0}, Point{0, 0, m_sliceStep}};
+  model.stored = [this](int i, int j, int k) { return At(i, j, k); };
+  return model;
 }
 
 std::vector<std::uint16_t> SamplesOf(const study::Study& study) {

@@ -41,6 +41,33 @@ class CutFixture : public testing::Test {
   study_test::TestFolder m_folder;
 };
 
+/// A small volume of random values on a straight grid of 1 mm, the first voxel at the origin; the
+/// tool reads it from "volume.bdf".
+class SmallVolume : public CutFixture {
+ protected:
+  /// `count` different values from `lowest` on. Slices lie `sliceStep` mm apart.
+  SmallVolume(const std::array<int, 3>& size, double sliceStep, unsigned seed, int lowest,
+              int count);
+
+  /// Writes the file anew, after values have been changed.
+  void Write() const { WriteVolume(Model(), PathOf("volume.bdf")); }
+  /// What stands in the file; lives as long as the test.
+  VolumeModel Model() const;
+
+  int& At(int i, int j, int k) { return m_values[IndexOf(i, j, k)]; }
+  int At(int i, int j, int k) const { return m_values[IndexOf(i, j, k)]; }
+
+  std::vector<int> m_values;
+
+ private:
+  std::size_t IndexOf(int i, int j, int k) const {
+    return static_cast<std::size_t>((k * m_size[1] + j) * m_size[0] + i);
+  }
+
+  std::array<int, 3> m_size;
+  double m_sliceStep;
+};
+
 /// The samples of a study's only slice.
 std::vector<std::uint16_t> SamplesOf(const study::Study& study);
 

@@ -2,19 +2,17 @@
 #include "GreyModel.h"
 
 #include <algorithm>
-#include <random>
 
 namespace {
 
 using cli_test::Arguments;
 using cli_test::Conditions;
-using cli_test::CutFixture;
 using cli_test::Outcome;
 using cli_test::Picture;
-using cli_test::Point;
 using cli_test::ReadBmp;
 using cli_test::ReadPng;
 using cli_test::RunTool;
+using cli_test::SmallVolume;
 using cli_test::VolumeModel;
 using Names = std::vector<std::string>;
 
@@ -24,23 +22,9 @@ constexpr int kSlices = 6;
 
 /// 9 x 7 x 6 voxels of 1 x 1 x 2 mm, the first at the origin, with values below 256: under the
 /// window of `Exact` each value is a grey level of its own.
-class Mip : public CutFixture {
+class Mip : public SmallVolume {
  protected:
-  void SetUp() override {
-    std::mt19937 random(20);
-    m_values.resize(std::size_t{kWidth} * kHeight * kSlices);
-    for (int& value : m_values) {
-      value = static_cast<int>(random() % 256);
-    }
-    m_volume.size = {kWidth, kHeight, kSlices};
-    m_volume.step = {Point{1, 0, 0}, Point{0, 1, 0}, Point{0, 0, 2}};
-    m_volume.stored = [this](int i, int j, int k) { return At(i, j, k); };
-    cli_test::WriteVolume(m_volume, PathOf("volume.bdf"));
-  }
-
-  int At(int i, int j, int k) const {
-    return m_values[static_cast<std::size_t>((k * kHeight + j) * kWidth + i)];
-  }
+  Mip() : SmallVolume({kWidth, kHeight, kSlices}, 2, 20, 0, 256) {}
 
   Picture Project(const Arguments& more) const {
     Arguments arguments{"mip", PathOf("volume.bdf"), "-o", PathOf("a.png"), "--window", "-873,255"};
@@ -63,8 +47,6 @@ class Mip : public CutFixture {
 
   int Level(int stored) const { return m_levels[static_cast<std::size_t>(stored)]; }
 
-  VolumeModel m_volume;
-  std::vector<int> m_values;
   std::vector<int> m_levels = cli_test::WindowLevels(127, 255, 256);
 };
 
@@ -129,7 +111,7 @@ TEST_F(Mip, ASlabTakesItsVoxelsOnly) {
 TEST_F(Mip, NoLayerIsJumpedOverInAThickSlab) {
   // One bright voxel in any slice must be seen whatever the slab's thickness.
   for (int bright = 0; bright < 40; ++bright) {
-    VolumeModel volume = m_volume;
+    VolumeModel volume = Model();
     volume.size = {1, 1, 40};
     volume.stored = [bright](int, int, int k) { return k == bright ? 255 : 0; };
     cli_test::WriteVolume(volume, PathOf("volume.bdf"));
@@ -141,7 +123,7 @@ TEST_F(Mip, NoLayerIsJumpedOverInAThickSlab) {
 TEST_F(Mip, TheUsualWindowLeavesTheMiddleOfAllThatIsNotBackgroundBlack) {
   // Half of the voxels are background, most others tissue of 1000 to 1002, a few are bone, and one
   // in 20,000 is metal.
-  VolumeModel volume = m_volume;
+  VolumeModel volume = Model();
   volume.size = {200, 100, 1};
   volume.stored = [](int i, int j, int) {
     return j < 50 ? (i == 7 && j == 7 ? 30000 : 0) : i < 4 ? 2001 : 1000 + i % 3;

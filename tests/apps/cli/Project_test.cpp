@@ -2,19 +2,17 @@
 #include "GreyModel.h"
 
 #include <algorithm>
-#include <random>
 
 namespace {
 
 using cli_test::Arguments;
 using cli_test::Conditions;
-using cli_test::CutFixture;
 using cli_test::Outcome;
 using cli_test::Picture;
 using cli_test::Point;
 using cli_test::ReadPng;
 using cli_test::RunTool;
-using cli_test::VolumeModel;
+using cli_test::SmallVolume;
 using Names = std::vector<std::string>;
 
 constexpr int kSide = 21;
@@ -22,28 +20,9 @@ constexpr int kMiddle = 10;
 
 /// 21 x 21 x 21 voxels of 1 mm, the first at the origin, with values from 1 to 250: under the
 /// window of `Draw` each value is a grey level of its own, and an outline is white.
-class Project : public CutFixture {
+class Project : public SmallVolume {
  protected:
-  void SetUp() override {
-    std::mt19937 random(3);
-    m_values.resize(std::size_t{kSide} * kSide * kSide);
-    for (int& value : m_values) {
-      value = 1 + static_cast<int>(random() % 250);
-    }
-    Write();
-  }
-
-  void Write() {
-    VolumeModel volume;
-    volume.size = {kSide, kSide, kSide};
-    volume.step = {Point{1, 0, 0}, Point{0, 1, 0}, Point{0, 0, 1}};
-    volume.stored = [this](int i, int j, int k) { return At(i, j, k); };
-    cli_test::WriteVolume(volume, PathOf("volume.bdf"));
-  }
-
-  int& At(int i, int j, int k) {
-    return m_values[static_cast<std::size_t>((k * kSide + j) * kSide + i)];
-  }
+  Project() : SmallVolume({kSide, kSide, kSide}, 1, 3, 1, 250) {}
 
   int Level(int stored) const { return m_levels[static_cast<std::size_t>(stored)]; }
 
@@ -58,7 +37,6 @@ class Project : public CutFixture {
     return ReadPng(PathOf("a.png"));
   }
 
-  std::vector<int> m_values;
   std::vector<int> m_levels = cli_test::WindowLevels(127, 255, 256);
 };
 

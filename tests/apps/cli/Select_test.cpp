@@ -4,20 +4,17 @@
 
 #include <algorithm>
 #include <map>
-#include <random>
 
 namespace {
 
 using cli_test::Arguments;
 using cli_test::Conditions;
-using cli_test::CutFixture;
 using cli_test::Lines;
 using cli_test::Outcome;
 using cli_test::Picture;
-using cli_test::Point;
 using cli_test::ReadPng;
 using cli_test::RunTool;
-using cli_test::VolumeModel;
+using cli_test::SmallVolume;
 using Names = std::vector<std::string>;
 
 constexpr int kWidth = 12;
@@ -25,28 +22,9 @@ constexpr int kHeight = 9;
 constexpr int kSlices = 5;
 
 /// 12 x 9 x 5 voxels of 1 x 1 x 2 mm; value = stored - 1000.
-class Select : public CutFixture {
+class Select : public SmallVolume {
  protected:
-  void SetUp() override {
-    std::mt19937 random(7);
-    m_values.resize(std::size_t{kWidth} * kHeight * kSlices);
-    for (int& value : m_values) {
-      value = static_cast<int>(random() % 400);
-    }
-    Write();
-  }
-
-  void Write() {
-    VolumeModel volume;
-    volume.size = {kWidth, kHeight, kSlices};
-    volume.step = {Point{1, 0, 0}, Point{0, 1, 0}, Point{0, 0, 2}};
-    volume.stored = [this](int i, int j, int k) { return At(i, j, k); };
-    cli_test::WriteVolume(volume, PathOf("volume.bdf"));
-  }
-
-  int& At(int i, int j, int k) {
-    return m_values[static_cast<std::size_t>((k * kHeight + j) * kWidth + i)];
-  }
+  Select() : SmallVolume({kWidth, kHeight, kSlices}, 2, 7, 0, 400) {}
 
   Outcome Run(const Arguments& more) const {
     Arguments arguments{"select", PathOf("volume.bdf"), "-o", PathOf("list.bdf")};
@@ -81,8 +59,6 @@ class Select : public CutFixture {
     std::sort(voxels.begin(), voxels.end());
     return voxels;
   }
-
-  std::vector<int> m_values;
 };
 
 TEST_F(Select, ByValueListsTheHighestValues) {
