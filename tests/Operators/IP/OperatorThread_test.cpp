@@ -183,6 +183,33 @@ TEST(OperatorThread, PixelOperatorsRunInTheirThreads) {
   }
 }
 
+// Every result is a new image, whose memory may have been another's a moment ago.
+TEST(OperatorThread, LookupsSideBySideKeepTheirPixels) {
+  constexpr std::size_t kPixels = std::size_t{400} * 400;
+  dImage sources[2];
+  dImage targets[2];
+  dBCGLUT luts[2];
+  opLookup ops[2];
+  for (int i = 0; i < 2; ++i) {
+    rasters::MakeOf<std::uint16_t>(
+        sources[i], {.width = 400, .height = 400, .type = ImageDataType_U16, .alignment = 2},
+        Samples(kPixels, static_cast<std::uint16_t>(20 + i)));
+    ops[i].m_pSource = &sources[i];
+    ops[i].m_pTarget = &targets[i];
+    ops[i].m_pLUT = &luts[i];
+  }
+  for (int round = 0; round < 20; ++round) {
+    for (opLookup& op : ops) {
+      ASSERT_TRUE(op.RunAsThread(0));
+    }
+    for (int i = 0; i < 2; ++i) {
+      ASSERT_TRUE(WaitForEnd(ops[i]));
+      ASSERT_EQ(SamplesOf<std::uint8_t>(targets[i]),
+                std::vector<std::uint8_t>(kPixels, static_cast<std::uint8_t>(20 + i)));
+    }
+  }
+}
+
 TEST(OperatorThread, PixelOperatorsEndedAtAnyMomentRunAgain) {
   Random random(6);
   dImage image;

@@ -17,9 +17,62 @@ constexpr std::size_t kLinesPerPage = 64;
 constexpr std::size_t kLargeBlock = std::size_t{1} << 16;
 constexpr std::size_t kSmallHead = alignof(std::max_align_t);
 
-/// In front of a block stands how far the allocation begins before it.
-using Head = std::uint64_t;
+/// Blocks of such sizes are kept once they are freed.
+constexpr std::size_t kSmallestKept = std::size_t{1} << 17;
+constexpr std::size_t kLargestKept = std::size_t{1} << 26;
+
+/// Stands in front of a block.
+struct Head {
+  std::uint64_t offset;  ///< how far the allocation begins before the block
+  std::uint64_t size;    ///< what the block holds
+};
 static_assert(sizeof(Head) <= kSmallHead);
+
+Head HeadOf(const void* block) {
+  Head head;
+  std::memcpy(&head, static_cast<const unsigned char*>(block) - sizeof(head), sizeof(head));
+  return head;
+}
+
+void Release(void* block) {
+  if (block != nullptr) {
+    std::free(static_cast<unsigned char*>(block) - HeadOf(block).offset);
+  }
+}
+
+#if defined(__SANITIZE_ADDRESS__)
+// A block that is used after it was freed is to be noticed.
+void* TakeKept(std::size_t) {
+  return nullptr;
+}
+void Keep(void* block) {
+  Release(block);
+}
+#else
+/// The block that was freed last, if it is worth keeping.
+std::atomic<void*> g_kept{nullptr};
+
+void Keep(void* block) {
+  Release(g_kept.exchange(block, std::memory_order_acq_rel));
+}
+
+/// The kept block, when it holds `size` bytes and not many more.
+void* TakeKept(std::size_t size) {
+  if (size < kSmallestKept || size > kLargestKept) {
+    return nullptr;
+  }
+  void* const block = g_kept.exchange(nullptr, std::memory_order_acq_rel);
+  if (block == nullptr) {
+    return nullptr;
+  }
+  const std::uint64_t held = HeadOf(block).size;
+  if (held >= size && held - size <= size / 8) {
+    return block;
+  }
+  Keep(block);
+  return nullptr;
+}
+#endif
 
 std::size_t NextStagger() {
   static std::atomic<std::uint32_t> count{0};
@@ -29,6 +82,9 @@ std::size_t NextStagger() {
 }  // namespace
 
 void* AllocateBlock(std::size_t size) {
+  if (void* const kept = TakeKept(size)) {
+    return kept;
+  }
   const bool isLarge = size >= kLargeBlock;
   const std::size_t stagger = isLarge ? kCacheLine + NextStagger() : 0;
   const std::size_t room = isLarge ? stagger + kCacheLine : kSmallHead;
@@ -40,20 +96,23 @@ void* AllocateBlock(std::size_t size) {
     return nullptr;
   }
   const auto address = reinterpret_cast<std::uintptr_t>(allocation);
-  const Head head =
+  const std::size_t offset =
       isLarge ? stagger + (kCacheLine - address % kCacheLine) % kCacheLine : kSmallHead;
-  std::memcpy(allocation + head - sizeof(head), &head, sizeof(head));
-  return allocation + head;
+  const Head head{offset, size};
+  std::memcpy(allocation + offset - sizeof(head), &head, sizeof(head));
+  return allocation + offset;
 }
 
 void FreeBlock(void* block) {
   if (block == nullptr) {
     return;
   }
-  Head head = 0;
-  auto* const bytes = static_cast<unsigned char*>(block);
-  std::memcpy(&head, bytes - sizeof(head), sizeof(head));
-  std::free(bytes - head);
+  const std::uint64_t size = HeadOf(block).size;
+  if (size >= kSmallestKept && size <= kLargestKept) {
+    Keep(block);
+  } else {
+    Release(block);
+  }
 }
 
 }  // namespace vorl_detail
