@@ -114,183 +114,143 @@ class OpenRenderer : public vIma2Device {
   using vIma2Device::ResetTransparency;
 };
 
-TEST(vIma2DeviceTransparent, OneBitImageCanBeAStencil) {
-  dImage image = NumberedImage(6, 4, 1, "G");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
+/// An image in its own size on a device with some pixels around it.
+class vIma2DeviceTransparent : public testing::Test {
+ protected:
+  /// Draws; every pixel is the image's, or the device's where the image has the colour.
+  void ExpectDrawn(const dImage& drawn, unsigned transparent) {
+    m_canvas.Fill(0x55);
+    ASSERT_TRUE(m_renderer.Draw(m_canvas));
+    ExpectPicture(m_canvas, drawn, *m_renderer.GetImageRect(), 1, false, transparent);
+  }
+  void ExpectDrawn(unsigned transparent) { ExpectDrawn(m_image, transparent); }
+  void Take(dImage& image) {
+    ASSERT_TRUE(m_renderer.Init(&image, nullptr, &m_target, false, false));
+  }
+
+  dImage m_image = Pattern("BGR");
+  const tagRECT m_target{1, 2, 7, 6};
+  OpenRenderer m_renderer;
+  Canvas m_canvas{10, 8};
+};
+
+TEST_F(vIma2DeviceTransparent, OneBitImageCanBeAStencil) {
+  m_image = NumberedImage(6, 4, 1, "G");
+  Take(m_image);
   for (const unsigned colour : {0U, 0xFFFFFFU}) {
-    Canvas canvas(10, 8);
-    canvas.Fill(0x55);
-    renderer.EnableTransparency(static_cast<unsigned long>(colour));
-    ASSERT_TRUE(renderer.Draw(canvas));
-    ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, colour);
+    m_renderer.EnableTransparency(static_cast<unsigned long>(colour));
+    ExpectDrawn(colour);
   }
 }
 
-TEST(vIma2DeviceTransparent, CanBeSwitchedOff) {
-  dImage image = Pattern("BGR");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  renderer.EnableTransparency(0xE0E0E0UL);
-  renderer.DisableTransparency();
-  Canvas canvas(10, 8);
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xFF000000);
+TEST_F(vIma2DeviceTransparent, CanBeSwitchedOff) {
+  Take(m_image);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  m_renderer.DisableTransparency();
+  ExpectDrawn(0xFF000000);
 }
 
-TEST(vIma2DeviceTransparent, SettingOutlivesTheImage) {
+TEST_F(vIma2DeviceTransparent, SettingOutlivesTheImage) {
   dImage first = NumberedImage(3, 3, 8, "BGR");
-  dImage image = Pattern("BGR");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  renderer.EnableTransparency(0xE0E0E0UL);
-  Canvas canvas(10, 8);
-  ASSERT_TRUE(renderer.Init(&first, nullptr, &target, false, false));
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  Take(first);
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
+  Take(m_image);
+  ExpectDrawn(0xE0E0E0);
 }
 
-TEST(vIma2DeviceTransparent, PixelOutlivesTheImageToo) {
+TEST_F(vIma2DeviceTransparent, PixelOutlivesTheImageToo) {
   dImage first = NumberedImage(6, 4, 8, "BGR");
-  dImage image = Pattern("BGR");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  renderer.EnableTransparency(1, 0);  // of the pattern's second colour
-  Canvas canvas(10, 8);
-  ASSERT_TRUE(renderer.Init(&first, nullptr, &target, false, false));
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+  m_renderer.EnableTransparency(1, 0);  // of the pattern's second colour
+  Take(first);
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
+  Take(m_image);
+  ExpectDrawn(0xE0E0E0);
 }
 
-TEST(vIma2DeviceTransparent, NewPixelsAreLookedAtWhenTheTransparencyIsSetAnew) {
-  dImage image = Pattern("BGR");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  Canvas canvas(10, 8);
-  for (const unsigned colour : {0xE0E0E0U, PixelOf(image, 0, 0), PixelOf(image, 5, 3)}) {
-    renderer.EnableTransparency(static_cast<unsigned long>(colour));
-    canvas.Fill(0x55);
-    ASSERT_TRUE(renderer.Draw(canvas));
-    ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, colour);
+TEST_F(vIma2DeviceTransparent, NewPixelsAreLookedAtWhenTheTransparencyIsSetAnew) {
+  Take(m_image);
+  for (const unsigned colour : {0xE0E0E0U, PixelOf(m_image, 0, 0), PixelOf(m_image, 5, 3)}) {
+    m_renderer.EnableTransparency(static_cast<unsigned long>(colour));
+    ExpectDrawn(colour);
   }
 }
 
-TEST(vIma2DeviceTransparent, BitmapsAreMadeOnceForAnImage) {
-  dImage image = Pattern("BGR");
-  const dImage before(image);
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  renderer.EnableTransparency(0xE0E0E0UL);
-  Canvas canvas(10, 8);
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  image.Fill(0x11);
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));  // what the image was
-  ExpectPicture(canvas, before, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
-  image = Pattern("G");  // formatted anew: what it is
-  canvas.Fill(0x55);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+TEST_F(vIma2DeviceTransparent, BitmapsAreMadeOnceForAnImage) {
+  const dImage before(m_image);
+  Take(m_image);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
+  m_image.Fill(0x11);
+  ExpectDrawn(before, 0xE0E0E0);  // what the image was
+  m_image = Pattern("G");
+  ExpectDrawn(0xE0E0E0);  // formatted anew: what it is
 }
 
-TEST(vIma2DeviceTransparent, CopyLooksAtTheSamePixel) {
-  dImage image = Pattern("BGR");
+TEST_F(vIma2DeviceTransparent, CopyLooksAtTheSamePixel) {
   const tagRECT source{0, 0, 6, 3};
   const tagRECT target{1, 2, 7, 5};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, &source, &target, false, true));
-  renderer.EnableTransparency(5, 2);
-  const vIma2Device first(renderer);
+  ASSERT_TRUE(m_renderer.Init(&m_image, &source, &target, false, true));
+  m_renderer.EnableTransparency(5, 2);
+  const vIma2Device first(m_renderer);
   vIma2Device copy(first);
-  Canvas canvas(10, 8);
   Canvas other(10, 8);
-  ASSERT_TRUE(renderer.Draw(canvas));
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
   ASSERT_TRUE(copy.Draw(other));
   for (int y = 0; y < 8; ++y) {
     for (int x = 0; x < 10; ++x) {
-      EXPECT_EQ(other.At(x, y), canvas.At(x, y)) << x << ", " << y;
+      EXPECT_EQ(other.At(x, y), m_canvas.At(x, y)) << x << ", " << y;
     }
   }
 }
 
-TEST(vIma2DeviceTransparent, ModeForgetsTheSettingOfTheOther) {
-  dImage image = Pattern("G");
-  *static_cast<unsigned char*>(image.GetDataPtr(3, 2)) = 0;
-  const tagRECT target{1, 2, 7, 6};
-  OpenRenderer renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  const auto draw = [&](unsigned transparent) {
-    Canvas canvas(10, 8);
-    canvas.Fill(0x55);
-    ASSERT_TRUE(renderer.Draw(canvas));
-    ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, transparent);
-  };
-  renderer.EnableTransparency(0xE0E0E0UL);
-  renderer.ResetTransparency(Transparency_Color);  // keeps the colour
-  draw(0xE0E0E0);
-  renderer.ResetTransparency(Transparency_None);
-  renderer.ResetTransparency(Transparency_Color);  // black
-  draw(0);
-  renderer.EnableTransparency(5, 3);
-  renderer.ResetTransparency(Transparency_Pixel);  // keeps the position
-  draw(PixelOf(image, 5, 3));
-  renderer.ResetTransparency(Transparency_Color);  // keeps the colour that was found
-  draw(PixelOf(image, 5, 3));
-  renderer.ResetTransparency(Transparency_Pixel);  // the first pixel
-  draw(PixelOf(image, 0, 0));
+TEST_F(vIma2DeviceTransparent, ModeForgetsTheSettingOfTheOther) {
+  m_image = Pattern("G");
+  *static_cast<unsigned char*>(m_image.GetDataPtr(3, 2)) = 0;
+  Take(m_image);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  m_renderer.ResetTransparency(Transparency_Color);  // keeps the colour
+  ExpectDrawn(0xE0E0E0);
+  m_renderer.ResetTransparency(Transparency_None);
+  m_renderer.ResetTransparency(Transparency_Color);  // black
+  ExpectDrawn(0);
+  m_renderer.EnableTransparency(5, 3);
+  m_renderer.ResetTransparency(Transparency_Pixel);  // keeps the position
+  ExpectDrawn(PixelOf(m_image, 5, 3));
+  m_renderer.ResetTransparency(Transparency_Color);  // keeps the colour that was found
+  ExpectDrawn(PixelOf(m_image, 5, 3));
+  m_renderer.ResetTransparency(Transparency_Pixel);  // the first pixel
+  ExpectDrawn(PixelOf(m_image, 0, 0));
 }
 
-TEST(vIma2DeviceTransparent, StretchModeIsTheCallers) {
-  dImage image = Pattern("BGR");
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, nullptr, false, false));
-  Canvas canvas(10, 8);
-  SetStretchBltMode(canvas, WHITEONBLACK);
-  renderer.EnableTransparency(0xE0E0E0UL);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  EXPECT_EQ(SetStretchBltMode(canvas, WHITEONBLACK), WHITEONBLACK);
-  renderer.DisableTransparency();
-  ASSERT_TRUE(renderer.Draw(canvas));
-  EXPECT_EQ(SetStretchBltMode(canvas, WHITEONBLACK), COLORONCOLOR);
+TEST_F(vIma2DeviceTransparent, StretchModeIsTheCallers) {
+  ASSERT_TRUE(m_renderer.Init(&m_image, nullptr, nullptr, false, false));
+  SetStretchBltMode(m_canvas, WHITEONBLACK);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
+  EXPECT_EQ(SetStretchBltMode(m_canvas, WHITEONBLACK), WHITEONBLACK);
+  m_renderer.DisableTransparency();
+  ASSERT_TRUE(m_renderer.Draw(m_canvas));
+  EXPECT_EQ(SetStretchBltMode(m_canvas, WHITEONBLACK), COLORONCOLOR);
 }
 
-TEST(vIma2DeviceTransparent, DevicesColoursAreRestored) {
-  dImage image = Pattern("BGR");
-  const tagRECT target{1, 2, 7, 6};
-  vIma2Device renderer;
-  ASSERT_TRUE(renderer.Init(&image, nullptr, &target, false, false));
-  renderer.EnableTransparency(0xE0E0E0UL);
-  Canvas canvas(10, 8);
-  canvas.Fill(0x55);
-  SetBkColor(canvas, 0x112233);
-  SetTextColor(canvas, 0x445566);
-  ASSERT_TRUE(renderer.Draw(canvas));
-  EXPECT_EQ(SetBkColor(canvas, 0), 0x112233U);
-  EXPECT_EQ(SetTextColor(canvas, 0), 0x445566U);
-  ExpectPicture(canvas, image, *renderer.GetImageRect(), 1, false, 0xE0E0E0);
+TEST_F(vIma2DeviceTransparent, DevicesColoursAreRestored) {
+  Take(m_image);
+  m_renderer.EnableTransparency(0xE0E0E0UL);
+  SetBkColor(m_canvas, 0x112233);
+  SetTextColor(m_canvas, 0x445566);
+  ExpectDrawn(0xE0E0E0);
+  EXPECT_EQ(SetBkColor(m_canvas, 0), 0x112233U);
+  EXPECT_EQ(SetTextColor(m_canvas, 0), 0x445566U);
 }
 
-TEST(vIma2DeviceTransparent, NothingIsDrawnWithoutAnImage) {
-  OpenRenderer renderer;
-  Canvas canvas(4, 4);
-  renderer.EnableTransparency(0UL);
-  EXPECT_FALSE(renderer.Draw(canvas));
-  EXPECT_FALSE(renderer.CreateMask(canvas));
-  SetBkColor(canvas, 0x112233);
-  EXPECT_FALSE(renderer.DrawTransparent(canvas));
-  EXPECT_EQ(SetBkColor(canvas, 0), 0x112233U);
+TEST_F(vIma2DeviceTransparent, NothingIsDrawnWithoutAnImage) {
+  m_renderer.EnableTransparency(0UL);
+  EXPECT_FALSE(m_renderer.Draw(m_canvas));
+  EXPECT_FALSE(m_renderer.CreateMask(m_canvas));
+  SetBkColor(m_canvas, 0x112233);
+  EXPECT_FALSE(m_renderer.DrawTransparent(m_canvas));
+  EXPECT_EQ(SetBkColor(m_canvas, 0), 0x112233U);
 }
 
 }  // namespace
