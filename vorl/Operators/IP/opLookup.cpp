@@ -160,7 +160,7 @@ bool opLookup::Process() {
 bool opLookup::Map(const dImage& source, const dImage& target) {
   const std::uint8_t* entries = m_pLUT->GetLUT(0);
   const vorl_detail::LookupTable table{entries, m_pLUT->GetStartIndex(), m_pLUT->GetSize()};
-  const vorl_detail::RunControl control{m_stopRequested, m_progress};
+  const vorl_detail::RunControl control{m_stopRequested, m_progress, HasThread()};
   if (const auto ramp = FindRamp(source, *m_pLUT)) {
     const auto map = [&](const std::uint16_t* from, std::uint8_t* to, std::size_t count) {
       vorl_detail::ActivePixelKernels().window(from, to, count, *ramp);
