@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <numeric>
 #include <random>
 #include <string>
 #include <tuple>
@@ -61,7 +62,10 @@ void ForEachRun(Check check) {
   constexpr unsigned kSeed = 7;
   SCOPED_TRACE("seed " + std::to_string(kSeed));
   std::mt19937 random(kSeed);
-  for (std::size_t count = 0; count <= kLongest; ++count) {
+  std::vector<std::size_t> counts(kLongest + 1);
+  std::iota(counts.begin(), counts.end(), std::size_t{0});
+  counts.insert(counts.end(), {511, 512, 513, 1000});  // some steps of the longest loop
+  for (const std::size_t count : counts) {
     const std::vector<T> samples = RandomSamples<T>(count, random);
     for (const GuardPages::Side side : GuardPages::kSides) {
       const GuardPages block(count * sizeof(T), side);

@@ -12,19 +12,71 @@ inline namespace vorl {
 namespace vorl_detail {
 namespace {
 
+// The extremes of samples, a register of each.
+template <class T>
+class Extremes {
+ public:
+  static constexpr std::size_t kStep = 256 / sizeof(T);
+
+  explicit Extremes(const T* first) : m_smallest(Load(first)), m_largest(m_smallest) {}
+
+  void Add(const T* samples) {
+    for (std::size_t i = 0; i < kStep; i += kCount) {
+      const Lanes lanes = Load(samples + i);
+      m_smallest = lanes < m_smallest ? lanes : m_smallest;
+      m_largest = lanes > m_largest ? lanes : m_largest;
+    }
+  }
+
+  void Raise(std::int32_t& minimum, std::int32_t& maximum) const {
+    T smallest[kCount];
+    T largest[kCount];
+    __builtin_memcpy(smallest, &m_smallest, sizeof(smallest));
+    __builtin_memcpy(largest, &m_largest, sizeof(largest));
+    T low = smallest[0];
+    T high = largest[0];
+    for (std::size_t i = 0; i < kCount; ++i) {
+      low = smallest[i] < low ? smallest[i] : low;
+      high = largest[i] > high ? largest[i] : high;
+    }
+    minimum = low < minimum ? low : minimum;
+    maximum = high > maximum ? high : maximum;
+  }
+
+ private:
+  typedef T Lanes __attribute__((vector_size(sizeof(Words))));
+  static constexpr std::size_t kCount = sizeof(Lanes) / sizeof(T);
+
+  static Lanes Load(const T* samples) {
+    Lanes lanes;
+    __builtin_memcpy(&lanes, samples, sizeof(lanes));
+    return lanes;
+  }
+
+  Lanes m_smallest;
+  Lanes m_largest;
+};
+
+// Images are mostly larger than the caches. One line in four is asked for 8 KB ahead; the machine
+// fetches its neighbours by itself: 150 MB are read at 21.8 instead of 15.9 GB/s (with every line
+// 21.8, too), 1 MB at 110 instead of 136. What lies behind the samples is not read.
 template <class T>
 void MinMax(const T* source, std::size_t count, std::int32_t& minimum, std::int32_t& maximum) {
-  if (count == 0) {
-    return;
+  constexpr std::size_t kStep = Extremes<T>::kStep;
+  constexpr std::uintptr_t kAhead = 8192;
+  if (count < kStep) {
+    return MinMaxRunRef(source, count, minimum, maximum);
   }
-  T smallest = source[0];
-  T largest = source[0];
-  for (std::size_t i = 0; i < count; ++i) {
-    smallest = source[i] < smallest ? source[i] : smallest;
-    largest = source[i] > largest ? source[i] : largest;
+  Extremes<T> extremes(source);
+  for (std::size_t i = 0; i + kStep <= count; i += kStep) {
+    __builtin_prefetch(
+        reinterpret_cast<const void*>(reinterpret_cast<std::uintptr_t>(source + i) + kAhead), 0, 2);
+    extremes.Add(source + i);
   }
-  minimum = smallest < minimum ? smallest : minimum;
-  maximum = largest > maximum ? largest : maximum;
+  if (count % kStep != 0) {
+    extremes.Add(source + count - kStep);  // the rest, and some samples again
+  }
+  extremes.Raise(minimum, maximum);
 }
 
 void MapBytes(const std::uint8_t* source, std::uint8_t* target, std::size_t count,
