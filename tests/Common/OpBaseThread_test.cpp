@@ -57,6 +57,21 @@ TEST(OpBaseThread, RunsAllStepsInAnotherThread) {
   EXPECT_STREQ(op.GetStatus(), "success");
 }
 
+TEST(OpBaseThread, HasAThreadFromTheStartUntilTheRunHasSucceeded) {
+  RecordingOp op;
+  bool inProcess = true;
+  op.process = [&] {
+    inProcess = op.HasThread();
+    return true;
+  };
+  ASSERT_TRUE(op.Run());
+  EXPECT_FALSE(inProcess) << "in the caller's thread";
+  ASSERT_TRUE(op.RunAsThread(0));
+  ASSERT_TRUE(WaitUntil([&] { return !op.HasThread(); }));
+  EXPECT_TRUE(inProcess) << "in its own thread";
+  EXPECT_STREQ(op.GetStatus(), "success");
+}
+
 TEST(OpBaseThread, IsRunningAsSoonAsItIsStarted) {
   WaitingOp op;
   ASSERT_TRUE(op.RunAsThread(0));

@@ -20,6 +20,7 @@ class RecordingOp : public OpBase {
   }
   ~RecordingOp() override { OpBase::Terminate(); }
 
+  using OpBase::HasThread;
   using OpBase::m_progress;
   using OpBase::m_status;
   using OpBase::m_stopRequested;

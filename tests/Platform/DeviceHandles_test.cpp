@@ -246,4 +246,17 @@ TEST(DeviceHandles, ThreadsDrawAtTheSameTime) {
   EXPECT_EQ(HandleTable::Instance().LiveCount(), before);
 }
 
+// So that a register of pixels is written into one line of the cache.
+TEST(DeviceHandles, PixelsOfASectionBeginAtACacheLine) {
+  for (const int width : {1, 3, 64, 1000, 3840}) {
+    const TestSection small(width, 1, 8);
+    const TestSection large(width, width, 32);
+    EXPECT_EQ(reinterpret_cast<std::uintptr_t>(small.pixels) % 64, 0U) << width;
+    EXPECT_EQ(reinterpret_cast<std::uintptr_t>(large.pixels) % 64, 0U) << width;
+    for (std::size_t i = 0; i < large.Bytes(); ++i) {
+      ASSERT_EQ(large.pixels[i], 0);
+    }
+  }
+}
+
 }  // namespace

@@ -82,6 +82,9 @@ class VORL_API OpBase : public BaseClass {
  protected:
   /// Ends a loop that found `m_stopRequested` set: sets the status "stopped"; returns false.
   bool Stopped();
+  /// True from `RunAsThread` until that run has succeeded or was terminated: only then does `Stop`
+  /// ask for anything.
+  bool HasThread() const;
 
   dStatus m_status;
   std::atomic<bool> m_stopRequested{false};
@@ -92,7 +95,6 @@ class VORL_API OpBase : public BaseClass {
 
   void CopyRun(const OpBase& source);
   void ResetProgress();
-  bool HasThread() const;
 
   mutable HRTimer m_timer;
   std::shared_ptr<vorl_detail::OperatorThread> m_thread;

@@ -201,7 +201,10 @@ class VORL_API dImage : public DataBase, public IBinaryDataIO {
   unsigned long GetNumRows() const;
   /// Channels << 8 | sample width, plus 0x10000 in plane order. Signed, unsigned and floating-point
   /// images of one layout share an identifier.
-  unsigned long GetFormatID() const;
+  unsigned long GetFormatID() const {
+    const unsigned long planes = m_dataOrder == ImageDataOrder_Plane ? 0x10000 : 0;
+    return (static_cast<unsigned long>(m_numChannels) << 8) | (m_dataType & 0xFFU) | planes;
+  }
   const char* GetChannelSequence() const;
   /// `ScanColorModel` of the channel sequence.
   const char* GetColorModel() const;

@@ -93,11 +93,6 @@ unsigned long dImage::GetNumRows() const {
   return GetNumPlanes() * static_cast<unsigned long>(m_rect.height);
 }
 
-unsigned long dImage::GetFormatID() const {
-  const unsigned long planes = m_dataOrder == ImageDataOrder_Plane ? 0x10000 : 0;
-  return (static_cast<unsigned long>(m_numChannels) << 8) | GetChannelDepth() | planes;
-}
-
 const char* dImage::GetChannelSequence() const {
   return m_channelSequence.c_str();
 }

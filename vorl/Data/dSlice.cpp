@@ -48,12 +48,6 @@ bool dSlice::IsValid() const {
   return m_image.IsValid();
 }
 
-dImage& dSlice::GetImage() {
-  return m_image;
-}
-const dImage& dSlice::GetImage() const {
-  return m_image;
-}
 std::int32_t dSlice::GetWidth() const {
   return ToSigned(m_image.GetWidth());
 }

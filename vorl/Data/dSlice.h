@@ -34,8 +34,8 @@ class VORL_API dSlice : public DataBase {
   static dSlice* Create();
   static ClassInfo& CI();
 
-  dImage& GetImage();
-  const dImage& GetImage() const;
+  dImage& GetImage() { return m_image; }
+  const dImage& GetImage() const { return m_image; }
   /// Pixels.
   std::int32_t GetWidth() const;
   std::int32_t GetHeight() const;

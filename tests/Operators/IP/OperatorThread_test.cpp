@@ -231,16 +231,18 @@ TEST(OperatorThread, PixelOperatorsEndedAtAnyMomentRunAgain) {
 }
 
 TEST(OperatorThread, ALoopOverRowsEndsBeforeTheNextOne) {
-  std::atomic<bool> stop{false};
-  std::atomic<double> progress{0.0};
-  std::vector<std::size_t> rows;
-  const auto row = [&](std::size_t index) {
-    rows.push_back(index);
-    stop = index == 2;
-  };
-  EXPECT_FALSE(vorl_detail::ForEachRow({stop, progress}, 8, row));
-  EXPECT_EQ(rows, (std::vector<std::size_t>{0, 1, 2}));
-  EXPECT_EQ(progress, 3.0 / 8.0);
+  for (const bool canBeAsked : {false, true}) {
+    std::atomic<bool> stop{false};
+    std::atomic<double> progress{0.0};
+    std::vector<std::size_t> rows;
+    const auto row = [&](std::size_t index) {
+      rows.push_back(index);
+      stop = index == 2;
+    };
+    EXPECT_FALSE(vorl_detail::ForEachRow({stop, progress, canBeAsked}, 8, row));
+    EXPECT_EQ(rows, (std::vector<std::size_t>{0, 1, 2}));
+    EXPECT_EQ(progress, 3.0 / 8.0);
+  }
 }
 
 }  // namespace

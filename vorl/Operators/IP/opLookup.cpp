@@ -1,6 +1,7 @@
 #include <vorl/Operators/IP/opLookup.h>
 
 #include <cstdint>
+#include <cstring>
 #include <optional>
 
 #include <vorl/Common/detail/ClassRegistration.h>
@@ -51,8 +52,8 @@ bool MapByteRows(const vorl_detail::RunControl& control, const dImage& source, c
       });
 }
 
-/// Looking for the arithmetic form of a table takes as long as some hundred thousand look-ups.
-constexpr std::uint64_t kFewSamples = 1U << 18;
+/// Looking for the arithmetic form of a table takes as long as some ten thousand look-ups.
+constexpr std::uint64_t kFewSamples = 1U << 16;
 
 // The table's arithmetic form, where it has one and the image is worth the search for it.
 std::optional<vorl_detail::WindowRamp> FindRamp(const dImage& source, dLUT& lut) {
@@ -69,6 +70,19 @@ std::optional<vorl_detail::WindowRamp> FindRamp(const dImage& source, dLUT& lut)
 bool HoldsEntries(dLUT& lut) {
   lut.GetLUT(0);  // brings the table up to date
   return vorl_detail::HoldsRows(static_cast<dImage&>(lut));
+}
+
+// Whether the image has the format that the result for `source` will have, in pixels of its own
+// that nobody reads on the way. Such pixels may as well be overwritten: to give the result new
+// memory each time costs more than the look-up.
+bool CanTakeResult(const dImage& image, const dImage& source, dLUT& lut) {
+  return vorl_detail::HoldsRows(image) && !image.GetDataBuffer().IsReference() &&
+         image.GetWidth() == source.GetWidth() && image.GetHeight() == source.GetHeight() &&
+         image.GetDataType() == lut.GetType() && image.GetDataOrder() == source.GetDataOrder() &&
+         image.GetRowAlignment() == source.GetRowAlignment() &&
+         std::strcmp(image.GetChannelSequence(), source.GetChannelSequence()) == 0 &&
+         !vorl_detail::SharePixels(image, source) &&
+         !vorl_detail::SharePixels(image, static_cast<dImage&>(lut));
 }
 
 }  // namespace
@@ -146,7 +160,7 @@ bool opLookup::Process() {
 bool opLookup::Map(const dImage& source, const dImage& target) {
   const std::uint8_t* entries = m_pLUT->GetLUT(0);
   const vorl_detail::LookupTable table{entries, m_pLUT->GetStartIndex(), m_pLUT->GetSize()};
-  const vorl_detail::RunControl control{m_stopRequested, m_progress};
+  const vorl_detail::RunControl control{m_stopRequested, m_progress, HasThread()};
   if (const auto ramp = FindRamp(source, *m_pLUT)) {
     const auto map = [&](const std::uint16_t* from, std::uint8_t* to, std::size_t count) {
       vorl_detail::ActivePixelKernels().window(from, to, count, *ramp);
@@ -171,22 +185,29 @@ bool opLookup::Map(const dImage& source, const dImage& target) {
   return finished || Stopped();
 }
 
-bool opLookup::Lookup8to8() {
-  dImage* target = m_pTarget != nullptr ? m_pTarget : m_pSource;
-  if (target != m_pSource && !target->Init(*m_pSource, 0, 0, 0)) {
-    m_status.Set(target->GetStatus(), "error while creating image buffer:");
+// Formats the image like the source, then fills it.
+bool opLookup::MapTo(dImage& image, unsigned short dataType) {
+  if (!image.Init(*m_pSource, 0, 0, dataType)) {
+    m_status.Set(image.GetStatus(), "error while creating image buffer:");
     return false;
   }
-  return Map(*m_pSource, *target);
+  return Map(*m_pSource, image);
+}
+
+bool opLookup::Lookup8to8() {
+  if (m_pTarget == nullptr || m_pTarget == m_pSource) {
+    return Map(*m_pSource, *m_pSource);
+  }
+  return MapTo(*m_pTarget, 0);
 }
 
 bool opLookup::Lookup16to8() {
-  dImage result;
-  if (!result.Init(*m_pSource, 0, 0, static_cast<unsigned short>(m_pLUT->GetType()))) {
-    m_status.Set(result.GetStatus(), "error while creating image buffer:");
-    return false;
+  const auto dataType = static_cast<unsigned short>(m_pLUT->GetType());
+  if (m_pTarget != nullptr && CanTakeResult(*m_pTarget, *m_pSource, *m_pLUT)) {
+    return MapTo(*m_pTarget, dataType);
   }
-  if (!Map(*m_pSource, result)) {
+  dImage result;
+  if (!MapTo(result, dataType)) {
     return false;
   }
   (m_pTarget != nullptr ? *m_pTarget : *m_pSource) <<= result;

@@ -24,8 +24,11 @@ inline namespace vorl {
 /// bit(must be 8 or 16 bit)", "missing LUT", "uninitialized LUT", "LUT has more(%d) than 1
 /// channel", "data depth of the LUT(%d bit) must be 8 bit", "error while creating image buffer:"
 /// followed by the image's message, and "stopped" after a stop request. A 16-bit source that is
-/// replaced stays as it is when the operator fails; of an 8-bit one, the rows before the stop have
-/// been replaced.
+/// replaced stays as it is when the operator fails; of an 8-bit one, and of a target that has the
+/// result's format already, the rows before the stop have been replaced.
+///
+/// *Cost.* A target that has the result's format keeps its memory, which spares more time than the
+/// look-up takes.
 class VORL_API opLookup : public OpBase {
  public:
   opLookup();
@@ -57,6 +60,7 @@ class VORL_API opLookup : public OpBase {
 
  private:
   bool Map(const dImage& source, const dImage& target);
+  bool MapTo(dImage& image, unsigned short dataType);
 
   std::int32_t m_lookupMode = -1;  ///< -1 none, 0 eight to eight, 1 sixteen to eight
 };

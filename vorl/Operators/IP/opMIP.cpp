@@ -126,7 +126,7 @@ bool opMIP::Project(dVolume& source, dSlice& target) {
     }
     return !bands.HasLeftRow();
   };
-  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
+  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress, HasThread()}, target, plane, row);
   return true;
 }
 
@@ -158,7 +158,7 @@ bool opMIP::ProjectList(dVolume& source, dBuffer& list, dSlice& target) {
       pixel = std::max(pixel, static_cast<T>(sampler.Voxel(voxel.x, voxel.y, voxel.z)));
     }
   };
-  vorl_detail::ForEachVoxel({m_stopRequested, m_progress}, voxels.Count(), draw);
+  vorl_detail::ForEachVoxel({m_stopRequested, m_progress, HasThread()}, voxels.Count(), draw);
   return true;
 }
 

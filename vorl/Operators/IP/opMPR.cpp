@@ -112,7 +112,7 @@ bool opMPR::Reconstruct(dVolume& source, dSlice& target, bool thick) {
     }
     return !bands.HasLeftRow();
   };
-  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, target, plane, row);
+  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress, HasThread()}, target, plane, row);
   return true;
 }
 

@@ -101,7 +101,8 @@ bool opMinMax::Search() {
     search(vorl_detail::RowOf<const T>(*m_pSource, index), m_pSource->GetDataSamplesInRow(),
            minimum, maximum);
   };
-  if (!vorl_detail::ForEachRow({m_stopRequested, m_progress}, m_pSource->GetNumRows(), row)) {
+  if (!vorl_detail::ForEachRow({m_stopRequested, m_progress, HasThread()}, m_pSource->GetNumRows(),
+                               row)) {
     return Stopped();
   }
   const bool found = maximum >= minimum;

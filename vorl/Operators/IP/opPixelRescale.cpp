@@ -164,7 +164,8 @@ bool opPixelRescale::Rescale(dImage* source, dImage* target, double factor, doub
   const auto row = [&](std::size_t index) {
     rescale(from + index * length, to + index * length, length);
   };
-  return vorl_detail::ForEachRow({m_stopRequested, m_progress}, source->GetNumRows(), row) ||
+  return vorl_detail::ForEachRow({m_stopRequested, m_progress, HasThread()}, source->GetNumRows(),
+                                 row) ||
          Stopped();
 }
 

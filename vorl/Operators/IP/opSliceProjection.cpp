@@ -203,7 +203,7 @@ bool opSliceProjection::DrawSlice(const dSlice& source, dSlice& plane) {
     }
     rowStart += toPlane.columnY;
   };
-  vorl_detail::ForEachRow({m_stopRequested, m_progress}, height, drawRow);
+  vorl_detail::ForEachRow({m_stopRequested, m_progress, HasThread()}, height, drawRow);
   return true;
 }
 
@@ -217,7 +217,7 @@ bool opSliceProjection::DrawVolume(const dVolume& source, dSlice& plane, bool li
     BackProjectRowRef(view, rays.depthStep, point, rays.columnStep, depths, pixels, width);
     ++index;
   };
-  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress}, plane, rays, row);
+  vorl_detail::ForEachPlaneRow<T>({m_stopRequested, m_progress, HasThread()}, plane, rays, row);
   return true;
 }
 
@@ -245,7 +245,7 @@ bool opSliceProjection::DrawVoxels(const dVolume& source, const dBuffer& list, d
           std::max(pixels[index], static_cast<T>(sampler.Voxel(voxel.x, voxel.y, voxel.z)));
     }
   };
-  vorl_detail::ForEachVoxel({m_stopRequested, m_progress}, voxels.Count(), draw);
+  vorl_detail::ForEachVoxel({m_stopRequested, m_progress, HasThread()}, voxels.Count(), draw);
   return true;
 }
 

@@ -317,7 +317,7 @@ bool opVoxelClassification::Count(int algo, const dVolume& source, const dVOI* r
         ++counters[Class::kNeighbours != 0 ? std::max(voxelClass, 0) : voxelClass];
       }
     };
-    vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress}, source, box, visit);
+    vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress, HasThread()}, source, box, visit);
     if (counter.IsValid()) {
       counter.ForEach(
           [&](std::uint16_t bits, std::uint32_t times) { counters[countedAs(bits)] += times; });
@@ -358,7 +358,7 @@ bool opVoxelClassification::Select(int classAlgo, const dVolume& source, const d
                                   entries + written * kEntryBytes, capacity - written);
       }
     };
-    vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress}, source, box, visit);
+    vorl_detail::ForEachVoxelRow<T>({m_stopRequested, m_progress, HasThread()}, source, box, visit);
   };
   if (classAlgo == VoxelClassificationAlgo_Edge) {
     select(vorl_detail::EdgeClass{}, std::int16_t{}, kernels.edgeClasses);

@@ -52,16 +52,25 @@ class RowSource {
   }
 
   /// The units for the columns from x.begin to x.end of a target row; valid until the next call.
-  const std::uint8_t* Row(int targetRow) {
+  /// They may be made in a place of the caller's, which then must keep them that long.
+  const std::uint8_t* Row(int targetRow, std::uint8_t* place = nullptr) {
     const auto k = static_cast<std::size_t>(targetRow - m_y.begin);
     const int first = m_y.first[k];
     const int last = m_y.last[k];
     if (m_current == nullptr || first != m_firstRow || last != m_lastRow) {
       m_firstRow = first;
       m_lastRow = last;
-      m_current = m_combines ? Combined(first, last) : Single(first);
+      m_current = m_combines ? Combined(first, last) : Single(first, place);
     }
     return m_current;
+  }
+
+  /// Writes those units to where they will be seen.
+  void Write(int targetRow, std::uint8_t* target) {
+    const std::uint8_t* const units = Row(targetRow, target);
+    if (units != target) {
+      std::memcpy(target, units, m_columns.size() * static_cast<std::size_t>(m_targetBytes));
+    }
   }
 
  private:
@@ -76,32 +85,41 @@ class RowSource {
     return m_unpacked.data();
   }
 
-  const std::uint8_t* Converted(const std::uint8_t* units, int count) {
+  // Each of the two steps works in the given place, or in memory of its own where there is none.
+  const std::uint8_t* Converted(const std::uint8_t* units, int count, std::uint8_t* place) {
     if (m_converter.IsCopy()) {
       return units;
     }
-    m_converted.resize(static_cast<std::size_t>(count) * static_cast<std::size_t>(m_targetBytes));
-    m_converter.Convert(units, m_converted.data(), count);
-    return m_converted.data();
+    if (place == nullptr) {
+      m_converted.resize(static_cast<std::size_t>(count) * static_cast<std::size_t>(m_targetBytes));
+      place = m_converted.data();
+    }
+    m_converter.Convert(units, place, count);
+    return place;
   }
 
-  const std::uint8_t* Stretched(const std::uint8_t* units, int bytes) {
+  const std::uint8_t* Stretched(const std::uint8_t* units, int bytes, std::uint8_t* place) {
     if (!m_plan) {
       return units;
     }
-    m_stretched.resize(m_columns.size() * static_cast<std::size_t>(bytes));
-    m_plan->Gather(units, m_stretched.data());
-    return m_stretched.data();
+    if (place == nullptr) {
+      m_stretched.resize(m_columns.size() * static_cast<std::size_t>(bytes));
+      place = m_stretched.data();
+    }
+    m_plan->Gather(units, place);
+    return place;
   }
 
-  // Pixels are converted before they are repeated and after they are left out.
-  const std::uint8_t* Single(int row) {
+  // Pixels are converted before they are repeated and after they are left out. The place is the
+  // last step's.
+  const std::uint8_t* Single(int row, std::uint8_t* place) {
     const std::uint8_t* units = SourceUnits(row);
     const int count = static_cast<int>(m_columns.size());
     if (m_repeats) {
-      return Stretched(Converted(units, m_sourceCount), m_targetBytes);
+      return Stretched(Converted(units, m_sourceCount, nullptr), m_targetBytes, place);
     }
-    return Converted(Stretched(units, m_surface.format.BytesPerUnit()), count);
+    std::uint8_t* const between = m_converter.IsCopy() ? place : nullptr;
+    return Converted(Stretched(units, m_surface.format.BytesPerUnit(), between), count, place);
   }
 
   // Pixels that share a place are combined as the destination would show them.
@@ -111,7 +129,7 @@ class RowSource {
     m_combined.assign(m_columns.size() * bytes, neutral);
     const int step = first <= last ? 1 : -1;
     for (int row = first; row != last + step; row += step) {
-      const std::uint8_t* units = Converted(SourceUnits(row), m_sourceCount);
+      const std::uint8_t* units = Converted(SourceUnits(row), m_sourceCount, nullptr);
       for (std::size_t k = 0; k < m_columns.size(); ++k) {
         const auto [low, high] = std::minmax(m_x.first[k], m_x.last[k]);
         AddColumns(units, low - m_left, high - m_left, &m_combined[k * bytes]);
@@ -215,7 +233,14 @@ void Blit(DeviceContext& context, const Axis& xAxis, const Axis& yAxis, const Bl
     while (next < boxes.size() && boxes[next].y1 == head.y1) {
       ++next;
     }
+    // Where all of a row is replaced, it is made where it will be seen.
+    const bool isWhole = operation.IsCopy() && target.format.depth >= 8 && next - band == 1 &&
+                         head.x1 <= x.begin && head.x2 >= x.end;
     for (int row = std::max(head.y1, y.begin); row < std::min(head.y2, y.end); ++row) {
+      if (isWhole) {
+        rows.Write(row, target.Row(row) + x.begin * bytes);
+        continue;
+      }
       const std::uint8_t* units = rows.Row(row);
       for (std::size_t i = band; i < next; ++i) {
         const int begin = std::max(boxes[i].x1, x.begin);

@@ -3,6 +3,8 @@
 #include <vorl/Platform/soft/HandleTable.h>
 
 #include <algorithm>
+#include <cstdint>
+#include <cstdlib>
 #include <cstring>
 #include <limits>
 #include <new>
@@ -44,16 +46,26 @@ void ReadColours(const BITMAPINFO* info, DibLayout* layout) {
   }
 }
 
-std::unique_ptr<std::uint8_t, FreeMemory> Zeros(std::uint64_t bytes) {
-  std::unique_ptr<std::uint8_t, FreeMemory> memory(
-      static_cast<std::uint8_t*>(std::calloc(static_cast<std::size_t>(bytes), 1)));
-  if (!memory) {
+// Pixels begin at a cache line, so that no register of them is written into two; how far the
+// allocation begins before them stands in front of them.
+constexpr std::size_t kCacheLine = 64;
+
+std::unique_ptr<std::uint8_t, FreePixels> Zeros(std::uint64_t bytes) {
+  auto* const memory =
+      static_cast<std::uint8_t*>(std::calloc(static_cast<std::size_t>(bytes) + kCacheLine, 1));
+  if (memory == nullptr) {
     throw std::bad_alloc();
   }
-  return memory;
+  const std::size_t head = kCacheLine - reinterpret_cast<std::uintptr_t>(memory) % kCacheLine;
+  memory[head - 1] = static_cast<std::uint8_t>(head);
+  return std::unique_ptr<std::uint8_t, FreePixels>(memory + head);
 }
 
 }  // namespace
+
+void FreePixels::operator()(std::uint8_t* pixels) const {
+  std::free(pixels - pixels[-1]);
+}
 
 Surface DibLayout::Over(std::uint8_t* pixels) const {
   Surface surface;

@@ -6,7 +6,6 @@
 #include <vorl/Platform/soft/Surface.h>
 
 #include <cstdint>
-#include <cstdlib>
 #include <memory>
 #include <vector>
 
@@ -59,9 +58,9 @@ struct RegionObject : Object {
   const Region region;
 };
 
-/// Gives memory from `std::calloc` back.
-struct FreeMemory {
-  void operator()(std::uint8_t* memory) const { std::free(memory); }
+/// Gives the pixels of a bitmap back.
+struct FreePixels {
+  void operator()(std::uint8_t* pixels) const;
 };
 
 /// A bitmap section or a device bitmap; it owns its pixels. The pixels change while contexts draw.
@@ -73,7 +72,7 @@ struct Bitmap : Object {
   bool bottomUp = false;      ///< the first row in memory is the bottom one
   BITMAPINFOHEADER header{};  ///< of a section
   int rowBytes = 0;           ///< as GetObjectA reports them
-  std::unique_ptr<std::uint8_t, FreeMemory> pixels;
+  std::unique_ptr<std::uint8_t, FreePixels> pixels;
 };
 
 }  // namespace vorl_detail

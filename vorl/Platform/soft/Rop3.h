@@ -19,6 +19,9 @@ class Rop3 {
  public:
   Rop3(DWORD rop, std::uint32_t patternPixel);
 
+  /// The result is the source.
+  bool IsCopy() const { return m_isCopy; }
+
   /// The whole operation, for codes that do not use the source.
   BitOperation WithoutSource() const { return m_on0; }
 

@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <numeric>
 #include <random>
 #include <string>
 #include <tuple>
@@ -61,7 +62,10 @@ void ForEachRun(Check check) {
   constexpr unsigned kSeed = 7;
   SCOPED_TRACE("seed " + std::to_string(kSeed));
   std::mt19937 random(kSeed);
-  for (std::size_t count = 0; count <= kLongest; ++count) {
+  std::vector<std::size_t> counts(kLongest + 1);
+  std::iota(counts.begin(), counts.end(), std::size_t{0});
+  counts.insert(counts.end(), {511, 512, 513, 1000});  // some steps of the longest loop
+  for (const std::size_t count : counts) {
     const std::vector<T> samples = RandomSamples<T>(count, random);
     for (const GuardPages::Side side : GuardPages::kSides) {
       const GuardPages block(count * sizeof(T), side);
@@ -184,8 +188,10 @@ TEST_P(PixelVariants, MappedBytesAreThePlainLoops) {
   }
 }
 
-// Every sample there is, and every length of a run, through the ramp and through the table.
-void ExpectRampEqualsTable(dWindowingLUT& lut, bool isSigned, const PixelKernels& kernels) {
+// Every sample there is, through the ramp and through the table. The ramps are counted by their
+// arithmetic.
+void ExpectRampEqualsTable(dWindowingLUT& lut, bool isSigned, const PixelKernels& kernels,
+                           int (&ramps)[2]) {
   const auto ramp = WindowRamp::Of(lut, isSigned, kernels.window);
   ASSERT_TRUE(ramp) << lut.GetWinCenter() << " / " << lut.GetWinWidth();
   std::vector<std::uint16_t> samples(65536);
@@ -199,6 +205,7 @@ void ExpectRampEqualsTable(dWindowingLUT& lut, bool isSigned, const PixelKernels
     ASSERT_EQ(given[i], entries[isSigned ? i ^ 0x8000U : i])
         << "sample " << i << " of " << lut.GetWinCenter() << " / " << lut.GetWinWidth();
   }
+  ++ramps[ramp->isFixed ? 1 : 0];
 }
 
 TEST_P(PixelVariants, WindowEqualsTheTable) {
@@ -207,24 +214,28 @@ TEST_P(PixelVariants, WindowEqualsTheTable) {
     return;
   }
   dWindowingLUT lut;
+  int ramps[2] = {};
   for (const bool isSigned : {false, true}) {
     lut.SetSignedSource(isSigned);
     const int base = isSigned ? -32768 : 0;
-    for (const int width : {2, 3, 100, 254, 255, 256, 350, 400, 1500, 2000, 4096, 65535, 65536}) {
+    for (const int width :
+         {2, 3, 100, 254, 255, 256, 350, 400, 1500, 2000, 4096, 20133, 31381, 65535, 65536}) {
       for (const int center : {1, 1064, 32768, 65000}) {
         lut.SetWindow(base + center, width);
-        ExpectRampEqualsTable(lut, isSigned, Kernels());
+        ExpectRampEqualsTable(lut, isSigned, Kernels(), ramps);
       }
     }
     lut.SetTargetRange(200, 10);
     lut.SetLimits(3, 255);
     for (const int width : {2, 90, 1500, 65536}) {
       lut.SetWindow(base + 20000, width);
-      ExpectRampEqualsTable(lut, isSigned, Kernels());
+      ExpectRampEqualsTable(lut, isSigned, Kernels(), ramps);
     }
     lut.SetTargetRange(0, 255);
     lut.SetLimits(0, 255);
   }
+  EXPECT_GT(ramps[0], 0) << "lines in single precision";
+  EXPECT_GT(ramps[1], 0) << "lines in whole numbers";
 }
 
 TEST_P(PixelVariants, WindowOfAnyLengthStaysInItsRun) {
@@ -238,6 +249,7 @@ TEST_P(PixelVariants, WindowOfAnyLengthStaysInItsRun) {
     lut.SetLimits(hasEnds ? 9 : 0, 255);
     const auto ramp = WindowRamp::Of(lut, false, Kernels().window);
     ASSERT_TRUE(ramp);
+    ASSERT_EQ(ramp->hasEnds, hasEnds);
     ForEachRun<std::uint16_t>([&](const std::uint16_t* samples, std::size_t count) {
       std::vector<std::uint8_t> expected;
       for (std::size_t i = 0; i < count; ++i) {
@@ -273,7 +285,7 @@ TEST(WindowRamp, EntryChangedByHandOutsideTheLineIsNotOverlooked) {
       vorl_detail::PixelKernelsOf(vorl_detail::ChooseVariant(nullptr)).window;
   dWindowingLUT lut;
   lut.SetWindow(1000, 400);
-  for (const int index : {0, 799, 1200, 65535}) {
+  for (const int index : {0, 799, 1201, 65535}) {
     std::uint8_t& entry = lut.GetLUT(0)[index];
     const std::uint8_t before = entry;
     entry ^= 1;
@@ -281,6 +293,20 @@ TEST(WindowRamp, EntryChangedByHandOutsideTheLineIsNotOverlooked) {
     entry = before;
   }
   EXPECT_EQ(WindowRamp::Of(lut, false, run).has_value(), run != nullptr);
+}
+
+TEST_P(PixelVariants, WindowKnowsAnEntryChangedByHandOnTheLine) {
+  if (Kernels().window == nullptr) {
+    ASSERT_EQ(GetParam(), CpuVariant::Reference);
+    return;
+  }
+  dWindowingLUT lut;
+  lut.SetWindow(1000, 256);
+  int ramps[2] = {};
+  for (const int index : {872, 1000, 1127, 1128}) {  // the first and last of the window, the next
+    lut.GetLUT(0)[index] ^= 0x40;
+    ExpectRampEqualsTable(lut, false, Kernels(), ramps);
+  }
 }
 
 }  // namespace

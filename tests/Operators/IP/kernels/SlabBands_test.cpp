@@ -175,7 +175,7 @@ TEST(RowLoop, ARowThatWasStoppedOnTheWayDoesNotCount) {
   const std::atomic<bool> isStopped = false;
   std::atomic<double> progress = 0.0;
   const auto untilThird = [](std::size_t index) { return index < 2; };
-  EXPECT_FALSE(vorl_detail::ForEachRow({isStopped, progress}, 4, untilThird));
+  EXPECT_FALSE(vorl_detail::ForEachRow({isStopped, progress, true}, 4, untilThird));
   EXPECT_EQ(progress, 0.5);
 }
 

@@ -31,7 +31,7 @@ Entries Visited(const dVolume& volume, const dVOI* region, std::uint32_t neighbo
     }
   };
   EXPECT_TRUE(vorl_detail::ForEachVoxelRow<std::uint16_t>(
-      {stopRequested, progress}, volume, VoxelBox(volume, region, neighbours), visit));
+      {stopRequested, progress, true}, volume, VoxelBox(volume, region, neighbours), visit));
   EXPECT_EQ(progress, 1.0);
   return entries;
 }
@@ -99,8 +99,8 @@ TEST_F(VoxelClasses, StopRequestsEndBeforeTheNextRow) {
   const auto visit = [&](const vorl_detail::VoxelRow<std::uint16_t>&) {
     stopRequested = ++rows == 2;
   };
-  EXPECT_FALSE(vorl_detail::ForEachVoxelRow<std::uint16_t>({stopRequested, progress}, m_volume,
-                                                           VoxelBox(m_volume, nullptr, 0), visit));
+  EXPECT_FALSE(vorl_detail::ForEachVoxelRow<std::uint16_t>(
+      {stopRequested, progress, true}, m_volume, VoxelBox(m_volume, nullptr, 0), visit));
   EXPECT_EQ(rows, 2);
   EXPECT_EQ(progress, 2.0 / 9.0);
 }

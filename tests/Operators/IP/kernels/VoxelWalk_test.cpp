@@ -12,7 +12,7 @@ using vorl_detail::ForEachVoxel;
 
 class VoxelWalk : public testing::Test {
  protected:
-  vorl_detail::RunControl Control() { return {m_stopRequested, m_progress}; }
+  vorl_detail::RunControl Control() { return {m_stopRequested, m_progress, true}; }
 
   std::atomic<bool> m_stopRequested{false};
   std::atomic<double> m_progress{0.0};

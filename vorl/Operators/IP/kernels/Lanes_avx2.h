@@ -111,11 +111,20 @@ class Words {
     const __m256i mixed = _mm256_packus_epi16(low.m_lanes, high.m_lanes);
     _mm256_storeu_si256(reinterpret_cast<__m256i*>(target), _mm256_permute4x64_epi64(mixed, 0xD8));
   }
+  /// The high byte of each lane, those of `low` first.
+  static void StoreHighBytes(const Words& low, const Words& high, std::uint8_t* target) {
+    StoreBytes(_mm256_srli_epi16(low.m_lanes, 8), _mm256_srli_epi16(high.m_lanes, 8), target);
+  }
 
   Words() = default;
 
   Words operator+(const Words& other) const { return _mm256_add_epi16(m_lanes, other.m_lanes); }
   Words operator-(const Words& other) const { return _mm256_sub_epi16(m_lanes, other.m_lanes); }
+  /// The low and the high 16 bits of the products of unsigned lanes.
+  Words operator*(const Words& other) const { return _mm256_mullo_epi16(m_lanes, other.m_lanes); }
+  Words HighProductUnsigned(const Words& other) const {
+    return _mm256_mulhi_epu16(m_lanes, other.m_lanes);
+  }
   Words operator&(const Words& other) const { return _mm256_and_si256(m_lanes, other.m_lanes); }
   Words operator|(const Words& other) const { return _mm256_or_si256(m_lanes, other.m_lanes); }
   Words MaxSigned(const Words& other) const { return _mm256_max_epi16(m_lanes, other.m_lanes); }

@@ -107,11 +107,20 @@ class Words {
     const __m512i order = _mm512_set_epi64(7, 5, 3, 1, 6, 4, 2, 0);
     _mm512_storeu_si512(target, _mm512_permutexvar_epi64(order, mixed));
   }
+  /// The high byte of each lane, those of `low` first.
+  static void StoreHighBytes(const Words& low, const Words& high, std::uint8_t* target) {
+    StoreBytes(_mm512_srli_epi16(low.m_lanes, 8), _mm512_srli_epi16(high.m_lanes, 8), target);
+  }
 
   Words() = default;
 
   Words operator+(const Words& other) const { return _mm512_add_epi16(m_lanes, other.m_lanes); }
   Words operator-(const Words& other) const { return _mm512_sub_epi16(m_lanes, other.m_lanes); }
+  /// The low and the high 16 bits of the products of unsigned lanes.
+  Words operator*(const Words& other) const { return _mm512_mullo_epi16(m_lanes, other.m_lanes); }
+  Words HighProductUnsigned(const Words& other) const {
+    return _mm512_mulhi_epu16(m_lanes, other.m_lanes);
+  }
   Words operator&(const Words& other) const { return _mm512_and_si512(m_lanes, other.m_lanes); }
   Words operator|(const Words& other) const { return _mm512_or_si512(m_lanes, other.m_lanes); }
   Words MaxSigned(const Words& other) const { return _mm512_max_epi16(m_lanes, other.m_lanes); }

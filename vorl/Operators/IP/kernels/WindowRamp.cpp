@@ -3,6 +3,7 @@
 #include <vorl/Data/dWindowingLUT.h>
 
 #include <algorithm>
+#include <cmath>
 #include <cstddef>
 #include <cstdlib>
 #include <numeric>
@@ -21,12 +22,14 @@ bool ForEachDifference(const WindowRamp& ramp, int first, int last, WindowRun* r
   constexpr int kChunk = 1024;
   std::uint16_t samples[kChunk];
   std::uint8_t given[kChunk];
+  // An index becomes a sample by adding as well as by exclusive or: only the top bit may flip.
+  std::iota(samples, samples + kChunk, static_cast<std::uint16_t>(first ^ ramp.flip));
   for (int start = first; start <= last; start += kChunk) {
     const int count = std::min(kChunk, last + 1 - start);
-    for (int i = 0; i < kChunk; ++i) {
-      samples[i] = static_cast<std::uint16_t>((start + i) ^ ramp.flip);
-    }
     run(samples, given, kChunk, ramp);  // whole: what is left of a run is looked up
+    for (std::uint16_t& sample : samples) {
+      sample = static_cast<std::uint16_t>(sample + kChunk);
+    }
     if (std::equal(given, given + count, ramp.entries + start)) {
       continue;
     }
@@ -65,6 +68,35 @@ struct Line {
   double value;  ///< at k = 0
   double step;
 };
+
+/// Sets a ramp to a line in single precision.
+void SetFloat(WindowRamp& ramp, const Line& line) {
+  ramp.isFixed = false;
+  ramp.factor = static_cast<float>(line.step);
+  ramp.offset = static_cast<float>(line.value);
+}
+
+/// Sets a ramp to a line of 24 fractional bits. What 8 of them cannot say of the line's value, the
+/// shift does: it adds its own multiple of the step's fraction.
+void SetFixed(WindowRamp& ramp, const Line& line) {
+  const std::int64_t step = std::llround(std::ldexp(line.step, 24));
+  const std::int64_t value = std::llround(std::ldexp(line.value, 24));
+  ramp.isFixed = true;
+  ramp.whole = static_cast<std::uint16_t>(step >> 16);
+  ramp.fraction = static_cast<std::uint16_t>(step);
+  const auto missOf = [&](int shift) {
+    const auto low = static_cast<std::int16_t>(value - std::int64_t{shift} * ramp.fraction);
+    return std::abs(int{low});
+  };
+  const int mostShift = std::min(255, kEntries - 1 - ramp.last);
+  int best = 0;
+  for (int shift = 1; shift <= mostShift; ++shift) {
+    best = missOf(shift) < missOf(best) ? shift : best;
+  }
+  const std::int64_t rest = value - std::int64_t{best} * ramp.fraction;
+  ramp.shift = static_cast<std::uint16_t>(best);
+  ramp.base = static_cast<std::uint16_t>((rest + 0x8000) >> 16);
+}
 
 /// The ways to lean the line a little: entries that lie exactly between two grey values fall to one
 /// side where the rounding errors of the repeated addition are positive, to the other where they
@@ -114,25 +146,28 @@ std::optional<WindowRamp> WindowRamp::Of(dWindowingLUT& lut, bool signedSamples,
   WindowRamp ramp{};
   ramp.flip = signedSamples ? 0x8000 : 0;
   ramp.first = static_cast<std::uint16_t>(begin);
-  ramp.last = static_cast<std::uint16_t>(end - 1 - begin);
   ramp.entries = table;
   lut.GetLimits(ramp.below, ramp.above);
+  // Mostly the line goes one step further than the window.
+  const int last = end < kEntries && ramp.above == high ? end : end - 1;
+  ramp.last = static_cast<std::uint16_t>(last - begin);
 
   const int range = high - low;
   const double step = static_cast<double>(range) / width;
   const Line line{low + 0.5 + (begin - (lowerEdge - base)) * step, step};
   // Entries that do not lie exactly between two grey values keep a distance from that.
   const double distance = std::gcd(2 * width, 2 * range) / (2.0 * width);
-  const auto fits = [&](const Line& candidate) {
-    ramp.factor = static_cast<float>(candidate.step);
-    ramp.offset = static_cast<float>(candidate.value);
-    return FindExceptions(ramp, run);
+  const auto fits = [&](auto setLine) {
+    return ForEachLeaning(line, ramp.last, distance / 4, [&](const Line& candidate) {
+      setLine(ramp, candidate);
+      return FindExceptions(ramp, run);
+    });
   };
-  if (!ForEachLeaning(line, ramp.last, distance / 4, fits)) {
+  if (!fits(SetFixed) && !fits(SetFloat)) {
     return std::nullopt;
   }
   ramp.hasEnds =
-      (begin > 0 && ramp.below != table[begin]) || (end < kEntries && ramp.above != table[end - 1]);
+      (begin > 0 && ramp.below != table[begin]) || (end < kEntries && ramp.above != table[last]);
   const bool isTrue =
       ForEachDifference(ramp, 0, kEntries - 1, run, [](int, std::uint8_t) { return false; });
   return isTrue ? std::optional(ramp) : std::nullopt;

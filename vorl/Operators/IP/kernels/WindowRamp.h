@@ -20,7 +20,10 @@ namespace vorl_detail {
 /// entry (a sample, less the table's start):
 ///
 /// 1. k = x - first, held to 0 and `last`;
-/// 2. y = k * factor + offset in single precision with two roundings, truncated;
+/// 2. y is the line's value at k, in one of two ways, both cut to whole numbers:
+///    - `isFixed`: y = (k * whole + ((k + shift) * fraction >> 16) + base) / 256 in 16 bits that
+///      wrap: a line of 24 fractional bits, which does for most windows and is the faster way;
+///    - y = k * factor + offset in single precision with two roundings;
 /// 3. y is replaced by `below` where x < first and by `above` where x > first + last;
 /// 4. y is replaced for the samples in `exceptions`.
 ///
@@ -48,6 +51,11 @@ struct WindowRamp {
   std::uint8_t above;
   bool hasEnds;  ///< false where the line's ends give `below` and `above` anyway
   int numExceptions;
+  bool isFixed;
+  std::uint16_t shift;     ///< as far as it takes no k beyond 65535
+  std::uint16_t whole;     ///< of 256 times the line's step
+  std::uint16_t fraction;  ///< of the same, times 65536
+  std::uint16_t base;
   float factor;
   float offset;
   Exception exceptions[kMostExceptions];  ///< those that are not needed repeat a true entry
