@@ -1,5 +1,4 @@
-// Where a sixteen-to-eight lookup puts its result: over the pixels of a target that has the
-// result's format already, else into memory of its own.
+// A sixteen-to-eight lookup makes its result in memory of its own, which becomes the target's.
 #include <vorl/Operators/IP/opLookup.h>
 
 #include <vorl/Data/dBCGLUT.h>
@@ -14,22 +13,6 @@ using rasters::Make;
 using rasters::MakeOf;
 using rasters::MessageOf;
 using rasters::SamplesOf;
-
-TEST(opLookup, ATargetOfTheResultsFormatKeepsItsMemory) {
-  dImage source;
-  MakeOf<std::uint16_t>(source, {2, 2, ImageDataType_U16, "G", 0, 2}, {3, 70, 80, 90});
-  dBCGLUT lut;
-  dImage target;
-  ASSERT_EQ(MessageOf(opLookup(&source, &target, &lut)), "success");
-  const void* const pixels = target.GetDataPtr();
-  target.Fill(1);
-  target.SetPosition(5, 7);
-  EXPECT_EQ(MessageOf(opLookup(&source, &target, &lut)), "success");
-  EXPECT_EQ(target.GetDataPtr(), pixels);
-  EXPECT_EQ(SamplesOf<std::uint8_t>(target), (std::vector<std::uint8_t>{3, 70, 80, 90}));
-  EXPECT_EQ(target.GetPosX(), 0);
-  EXPECT_EQ(target.GetPosY(), 0);
-}
 
 TEST(opLookup, ATargetOfAnotherFormatIsFormatted) {
   dImage source;
@@ -51,6 +34,23 @@ TEST(opLookup, ATargetOfAnotherFormatIsFormatted) {
     EXPECT_EQ(target.GetRowAlignment(), 2U);
     EXPECT_STREQ(target.GetChannelSequence(), "G");
   }
+}
+
+TEST(opLookup, AStoppedLookupLeavesItsTargetAsItIs) {
+  dImage source;
+  MakeOf<std::uint16_t>(source, {2, 2, ImageDataType_U16, "G", 0, 2}, {3, 70, 80, 90});
+  dBCGLUT lut;
+  dImage target;
+  MakeOf<std::uint8_t>(target, {3, 1}, {1, 2, 3});
+  const void* const pixels = target.GetDataPtr();
+  rasters::StoppedBeforeWork<opLookup> op;
+  op.m_pSource = &source;
+  op.m_pTarget = &target;
+  op.m_pLUT = &lut;
+  EXPECT_FALSE(op());
+  EXPECT_EQ(MessageOf(op), "stopped");
+  EXPECT_EQ(target.GetDataPtr(), pixels);
+  EXPECT_EQ(SamplesOf<std::uint8_t>(target), (std::vector<std::uint8_t>{1, 2, 3}));
 }
 
 TEST(opLookup, PixelsThatATargetRefersToStay) {

@@ -1,7 +1,6 @@
 #include <vorl/Operators/IP/opLookup.h>
 
 #include <cstdint>
-#include <cstring>
 #include <optional>
 
 #include <vorl/Common/detail/ClassRegistration.h>
@@ -70,19 +69,6 @@ std::optional<vorl_detail::WindowRamp> FindRamp(const dImage& source, dLUT& lut)
 bool HoldsEntries(dLUT& lut) {
   lut.GetLUT(0);  // brings the table up to date
   return vorl_detail::HoldsRows(static_cast<dImage&>(lut));
-}
-
-// Whether the image has the format that the result for `source` will have, in pixels of its own
-// that nobody reads on the way. Such pixels may as well be overwritten: to give the result new
-// memory each time costs more than the look-up.
-bool CanTakeResult(const dImage& image, const dImage& source, dLUT& lut) {
-  return vorl_detail::HoldsRows(image) && !image.GetDataBuffer().IsReference() &&
-         image.GetWidth() == source.GetWidth() && image.GetHeight() == source.GetHeight() &&
-         image.GetDataType() == lut.GetType() && image.GetDataOrder() == source.GetDataOrder() &&
-         image.GetRowAlignment() == source.GetRowAlignment() &&
-         std::strcmp(image.GetChannelSequence(), source.GetChannelSequence()) == 0 &&
-         !vorl_detail::SharePixels(image, source) &&
-         !vorl_detail::SharePixels(image, static_cast<dImage&>(lut));
 }
 
 }  // namespace
@@ -203,9 +189,6 @@ bool opLookup::Lookup8to8() {
 
 bool opLookup::Lookup16to8() {
   const auto dataType = static_cast<unsigned short>(m_pLUT->GetType());
-  if (m_pTarget != nullptr && CanTakeResult(*m_pTarget, *m_pSource, *m_pLUT)) {
-    return MapTo(*m_pTarget, dataType);
-  }
   dImage result;
   if (!MapTo(result, dataType)) {
     return false;

@@ -23,12 +23,9 @@ inline namespace vorl {
 /// hold the rows), "multi channel(%d) source images are not supported", "invalid channel depth:%d
 /// bit(must be 8 or 16 bit)", "missing LUT", "uninitialized LUT", "LUT has more(%d) than 1
 /// channel", "data depth of the LUT(%d bit) must be 8 bit", "error while creating image buffer:"
-/// followed by the image's message, and "stopped" after a stop request. A 16-bit source that is
-/// replaced stays as it is when the operator fails; of an 8-bit one, and of a target that has the
-/// result's format already, the rows before the stop have been replaced.
-///
-/// *Cost.* A target that has the result's format keeps its memory, which spares more time than the
-/// look-up takes.
+/// followed by the image's message, and "stopped" after a stop request. The target of a 16-bit
+/// source, and such a source that is replaced, stay as they are when the operator fails; of an
+/// 8-bit one, the rows before the stop have been replaced.
 class VORL_API opLookup : public OpBase {
  public:
   opLookup();

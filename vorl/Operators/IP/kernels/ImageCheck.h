@@ -9,7 +9,6 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <functional>
 
 inline namespace vorl {
 namespace vorl_detail {
@@ -24,15 +23,6 @@ inline bool HoldsBytes(const dImage& image, std::uint64_t count, std::uint64_t s
 inline bool HoldsRows(const dImage& image) {
   return HoldsBytes(image, std::uint64_t{image.GetBytesPerRow()} * image.GetNumRows(),
                     std::max(image.GetChannelDepth() / 8U, 1U));
-}
-
-/// True when a byte of one image's pixels is one of the other's, too.
-inline bool SharePixels(const dImage& a, const dImage& b) {
-  const std::less<const unsigned char*> before;
-  const auto* const firstOfA = static_cast<const unsigned char*>(a.GetDataPtr());
-  const auto* const firstOfB = static_cast<const unsigned char*>(b.GetDataPtr());
-  return before(firstOfA, firstOfB + b.GetImageSize()) &&
-         before(firstOfB, firstOfA + a.GetImageSize());
 }
 
 }  // namespace vorl_detail
