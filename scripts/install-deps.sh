@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
 # Installs the packages that the project needs and this machine lacks (Debian and relatives).
 #
-#   scripts/install-deps.sh [GROUP...]     groups: build test check tidy coverage windows;
-#                                          without any: all
+#   scripts/install-deps.sh [GROUP...]     groups: build test check tidy coverage windows peers;
+#                                          without any: all but peers
 #
 # Asks the package database first: when nothing is missing, nothing is downloaded and no rights are
 # needed. Without apt-get, or without the right to use it, prints what is needed and what for, and
@@ -26,6 +26,7 @@ build    pkg-config         finds the libraries that the graphics device uses
 test     libbenchmark-dev   the benchmarks
 test     libgmock-dev       the tests
 test     libgtest-dev       the tests
+test     python3            the test of a report
 check    clang-format       the format check; version 14 decides
 tidy     clang-tidy         static analysis
 coverage gcovr              the line coverage report
@@ -34,6 +35,9 @@ windows  g++-mingw-w64-x86-64-posix  the compiler for Windows
 windows  googletest         the sources of GoogleTest
 windows  libz-mingw-w64-dev  zlib for Windows
 windows  wine64             runs programs for Windows
+peers    libopencv-dev      a library that the benchmarks compare with
+peers    libvtk9-dev        a library that the benchmarks compare with
+peers    libyuv-dev         a library that the benchmarks compare with
 '
 
 die() {
@@ -43,16 +47,20 @@ die() {
 
 for group in "$@"; do
   case "$group" in
-    build | test | check | tidy | coverage | windows) ;;
-    *) die "unknown group '$group' (build, test, check, tidy, coverage, windows)" ;;
+    build | test | check | tidy | coverage | windows | peers) ;;
+    *) die "unknown group '$group' (build, test, check, tidy, coverage, windows, peers)" ;;
   esac
 done
 
-# wanted GROUP GROUP...: is the first among the others? Without others, everything is.
+# wanted GROUP GROUP...: is the first among the others? Without others, everything is but the
+# libraries to compare with: they are large, and nothing else needs them.
 wanted() {
   local group="$1" choice
   shift
-  [ $# -eq 0 ] && return 0
+  if [ $# -eq 0 ]; then
+    [ "$group" != peers ]
+    return
+  fi
   for choice in "$@"; do
     [ "$choice" = "$group" ] && return 0
   done

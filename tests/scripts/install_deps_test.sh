@@ -57,7 +57,7 @@ expect_output_contains() {
 
 build_packages='ca-certificates cmake g++ ninja-build fonts-dejavu-core libcli11-dev libdcmtk-dev'
 build_packages+=' libfontconfig-dev libfreetype-dev libpixman-1-dev libpng-dev pkg-config'
-test_packages='libbenchmark-dev libgmock-dev libgtest-dev'
+test_packages='libbenchmark-dev libgmock-dev libgtest-dev python3'
 windows_packages='dpkg-dev g++-mingw-w64-x86-64-posix googletest libz-mingw-w64-dev wine64'
 install='apt-get install -y --no-install-recommends'
 
@@ -87,6 +87,15 @@ GroupsLimitWhatIsInstalled() {
   expect result "$result" 0
   expect calls "$calls" "apt-get update
 $install $build_packages $test_packages"
+}
+
+LibrariesToCompareWithAreInstalledOnRequest() {
+  is_debian
+  user_is 0
+  install_deps peers
+  expect result "$result" 0
+  expect calls "$calls" "apt-get update
+$install libopencv-dev libvtk9-dev libyuv-dev"
 }
 
 AnotherUserInstallsThroughSudo() {
