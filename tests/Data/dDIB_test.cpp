@@ -250,6 +250,49 @@ TEST_F(dDIBFile, BitmapFileBecomesTheSection) {
   EXPECT_TRUE(ShowsItsSection(dib));
 }
 
+// Memory that was full of other bytes shows what a file leaves unwritten.
+TEST_F(dDIBFile, EveryByteOfTheRowsComesFromTheFile) {
+  for (const int bits : {1, 4, 8, 16, 24, 32}) {
+    bitmap_test::Bitmap bitmap;
+    bitmap.width = 5;
+    bitmap.height = 300;
+    bitmap.bits = bits;
+    MakeFile(bitmap_test::FileOf(bitmap));
+    std::vector<unsigned char> first;
+    for (const char garbage : {'\x11', '\x6E'}) {
+      dDIB dib(FileName());
+      ASSERT_TRUE(dib.IsValid()) << bits;
+      dib.Fill(garbage);
+      ASSERT_TRUE(dib.Init(FileName())) << bits;
+      const auto* const bytes = static_cast<const unsigned char*>(dib.GetDataPtr());
+      const std::vector<unsigned char> all(bytes, bytes + dib.GetImageSize());
+      first = first.empty() ? all : first;
+      EXPECT_EQ(all, first) << bits;
+    }
+  }
+}
+
+TEST_F(dDIBFile, FormattingAfterAFileClearsThePixels) {
+  bitmap_test::Bitmap bitmap;
+  bitmap.width = 64;
+  bitmap.height = 64;
+  bitmap.bits = 32;
+  MakeFile(bitmap_test::FileOf(bitmap));
+  const auto expectZeros = [](dDIB& dib) {
+    dib.Fill(0x55);
+    ASSERT_TRUE(dib.Init(64, 64, 4, 8));
+    const auto* const bytes = static_cast<const unsigned char*>(dib.GetDataPtr());
+    EXPECT_EQ(std::vector<unsigned char>(bytes, bytes + dib.GetImageSize()),
+              std::vector<unsigned char>(dib.GetImageSize()));
+  };
+  dDIB dib(FileName());
+  ASSERT_TRUE(dib.IsValid());
+  expectZeros(dib);
+  EXPECT_FALSE(dib.Init((std::string(FileName()) + "x").c_str()));
+  ASSERT_TRUE(dib.Init(64, 64, 4, 8));
+  expectZeros(dib);
+}
+
 TEST_F(dDIBFile, FileThatCannotBeReadTellsWhy) {
   dDIB dib(4, 4, 1, 8);
   LogRecorder log;

@@ -6,6 +6,7 @@
 #include <vorl/Common/detail/ClassRegistration.h>
 #include <vorl/Data/detail/ImageLayout.h>
 #include <vorl/IO/File/opDIB2Ima.h>
+#include <vorl/Platform/detail/Section.h>
 
 inline namespace vorl {
 
@@ -140,7 +141,9 @@ bool dDIB::Init(unsigned long width, unsigned long height, unsigned short dataTy
 bool dDIB::CreateSection(LogContext& context, unsigned long size) {
   void* bits = nullptr;
   const HDC screen = CreateCompatibleDC(nullptr);
-  m_handle = CreateDIBSection(screen, m_descriptor.GetHeader(), DIB_RGB_COLORS, &bits, nullptr, 0);
+  const BITMAPINFO* const info = m_descriptor.GetHeader();
+  m_handle = m_isToBeFilled ? vorl_detail::CreateSectionToFill(screen, info, &bits)
+                            : CreateDIBSection(screen, info, DIB_RGB_COLORS, &bits, nullptr, 0);
   DeleteDC(screen);
   if (m_handle == nullptr || bits == nullptr) {
     m_status.Set(false, "CreateDIBSection failed");
@@ -181,7 +184,11 @@ bool dDIB::Init(const char* filePath) {
   dDIB named;  // the path may be this bitmap's own, which a reset clears
   named.SetFileName(filePath);
   opDIB2Ima importer;
-  if (!importer.Convert(filePath != nullptr ? named.m_fileName.c_str() : nullptr, *this)) {
+  m_isToBeFilled = true;
+  const bool isRead =
+      importer.Convert(filePath != nullptr ? named.m_fileName.c_str() : nullptr, *this);
+  m_isToBeFilled = false;
+  if (!isRead) {
     m_status.Set(importer.GetStatus(), "initialization error:");
     return Fail(context, __LINE__);
   }

@@ -69,8 +69,8 @@ class VORL_API dDIB : public dImage {
 
  protected:
   /// Describes the pixels anew. Called whenever the format changes; a derived class calls it first
-  /// when it overrides it. Fails with "initialization error:" and the descriptor's message; the
-  /// bitmap is then reset.
+  /// when it overrides it. When a file is read, the pixels come later. Fails with "initialization
+  /// error:" and the descriptor's message; the bitmap is then reset.
   void OnInit() override;
 
  public:
@@ -156,6 +156,7 @@ class VORL_API dDIB : public dImage {
   dImaDescriptorDIB m_descriptor;  ///< of this bitmap
   HBITMAP m_handle = nullptr;
   bool m_ownsHandle = false;
+  bool m_isToBeFilled = false;  ///< a file is read, and writes every byte of the section
   std::string m_fileName;
 };
 

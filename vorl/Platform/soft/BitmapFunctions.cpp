@@ -1,3 +1,4 @@
+#include <vorl/Platform/detail/Section.h>
 #include <vorl/Platform/soft/Blit.h>
 #include <vorl/Platform/soft/DibLayout.h>
 
@@ -63,10 +64,8 @@ int SupportedDepth(UINT bitCount) {
   return 0;
 }
 
-}  // namespace
-
-HBITMAP CreateDIBSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits, HANDLE section,
-                         DWORD /*offset*/) {
+HBITMAP CreateSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits, HANDLE section,
+                      NewPixels pixels) {
   if (bits != nullptr) {
     *bits = nullptr;
   }
@@ -79,13 +78,24 @@ HBITMAP CreateDIBSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits
       SetError(ERROR_INVALID_PARAMETER);
       return nullptr;
     }
-    const auto bitmap = MakeSection(*layout);
+    const auto bitmap = MakeSection(*layout, pixels);
     const auto handle = Enter<HBITMAP>(bitmap);
     if (bits != nullptr && handle != nullptr) {
       *bits = bitmap->pixels.get();
     }
     return handle;
   });
+}
+
+}  // namespace
+
+HBITMAP CreateDIBSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits, HANDLE section,
+                         DWORD /*offset*/) {
+  return CreateSection(dc, info, usage, bits, section, NewPixels::Zeros);
+}
+
+HBITMAP vorl::vorl_detail::CreateSectionToFill(HDC dc, const BITMAPINFO* info, void** bits) {
+  return CreateSection(dc, info, DIB_RGB_COLORS, bits, nullptr, NewPixels::Unset);
 }
 
 HBITMAP CreateCompatibleBitmap(HDC dc, int width, int height) {

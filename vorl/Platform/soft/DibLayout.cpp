@@ -50,9 +50,10 @@ void ReadColours(const BITMAPINFO* info, DibLayout* layout) {
 // allocation begins before them stands in front of them.
 constexpr std::size_t kCacheLine = 64;
 
-std::unique_ptr<std::uint8_t, FreePixels> Zeros(std::uint64_t bytes) {
-  auto* const memory =
-      static_cast<std::uint8_t*>(std::calloc(static_cast<std::size_t>(bytes) + kCacheLine, 1));
+std::unique_ptr<std::uint8_t, FreePixels> MakePixels(std::uint64_t bytes, NewPixels pixels) {
+  const std::size_t size = static_cast<std::size_t>(bytes) + kCacheLine;
+  auto* const memory = static_cast<std::uint8_t*>(pixels == NewPixels::Zeros ? std::calloc(size, 1)
+                                                                             : std::malloc(size));
   if (memory == nullptr) {
     throw std::bad_alloc();
   }
@@ -125,9 +126,9 @@ std::optional<DibLayout> ReadLayout(const BITMAPINFO* info, UINT usage) {
   return layout;
 }
 
-std::shared_ptr<Bitmap> MakeSection(const DibLayout& layout) {
+std::shared_ptr<Bitmap> MakeSection(const DibLayout& layout, NewPixels pixels) {
   auto bitmap = std::make_shared<Bitmap>();
-  bitmap->pixels = Zeros(layout.Bytes());
+  bitmap->pixels = MakePixels(layout.Bytes(), pixels);
   bitmap->surface = layout.Over(bitmap->pixels.get());
   bitmap->section = true;
   bitmap->bottomUp = layout.bottomUp;
@@ -151,7 +152,8 @@ std::shared_ptr<Bitmap> MakeDeviceBitmap(std::int64_t width, std::int64_t height
   auto bitmap = std::make_shared<Bitmap>();
   bitmap->rowBytes = static_cast<int>(RowBytes(static_cast<int>(width), depth, 16));
   bitmap->pixels =
-      Zeros(static_cast<std::uint64_t>(bitmap->rowBytes) * static_cast<std::uint64_t>(height));
+      MakePixels(static_cast<std::uint64_t>(bitmap->rowBytes) * static_cast<std::uint64_t>(height),
+                 NewPixels::Zeros);
   bitmap->surface.top = bitmap->pixels.get();
   bitmap->surface.pitch = bitmap->rowBytes;
   bitmap->surface.width = static_cast<int>(width);

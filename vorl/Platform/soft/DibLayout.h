@@ -31,8 +31,11 @@ std::optional<DibLayout> ReadLayout(const BITMAPINFO* info, UINT usage);
 /// The layout of a header without colours: sizes, depth and orientation.
 std::optional<DibLayout> ReadHeader(const BITMAPINFOHEADER& header);
 
-/// A section of a layout, its pixels 0. Throws `std::bad_alloc`.
-std::shared_ptr<Bitmap> MakeSection(const DibLayout& layout);
+/// What the bytes of a new section are: zeros, or whatever was in the memory.
+enum class NewPixels { Zeros, Unset };
+
+/// A section of a layout. Throws `std::bad_alloc`.
+std::shared_ptr<Bitmap> MakeSection(const DibLayout& layout, NewPixels pixels = NewPixels::Zeros);
 
 /// A device bitmap. Null, with the error set, beyond 2 GB; throws `std::bad_alloc`.
 std::shared_ptr<Bitmap> MakeDeviceBitmap(std::int64_t width, std::int64_t height, int depth);
