@@ -1,4 +1,4 @@
-// Rows read from a file to where they belong.
+// Rows read from a file to where they belong, and written to one from where they are.
 
 #include <vorl/Platform/detail/File.h>
 
@@ -13,6 +13,7 @@ namespace {
 
 using vorl_detail::FileHandle;
 using vorl_detail::ReadFileRows;
+using vorl_detail::WriteFileRows;
 
 constexpr std::size_t kHead = 54;
 
@@ -86,5 +87,53 @@ TEST_F(FileRows, FilesThatEndTooSoonFail) {
   EXPECT_TRUE(ReadFileRows(m_file.get(), kHead, memory.data(), 999, 999, 1));
   EXPECT_TRUE(ReadFileRows(m_file.get(), 100000, memory.data(), 10, 10, 0));
 }
+
+// Rows of a pitch, in the order in which they are written, and a head before them.
+void ExpectWritten(const std::string& path, std::size_t rowBytes, std::size_t rows,
+                   bool isUpwards) {
+  SCOPED_TRACE(testing::Message() << rows << " rows of " << rowBytes << " bytes");
+  const std::size_t pitch = rowBytes + 5;
+  std::vector<unsigned char> memory(pitch * rows);
+  for (std::size_t i = 0; i < memory.size(); ++i) {
+    memory[i] = ByteAt(i);
+  }
+  std::vector<unsigned char> expected{'h', 'e', 'a', 'd'};
+  for (std::size_t row = 0; row < rows; ++row) {
+    const std::size_t place = isUpwards ? rows - 1 - row : row;
+    const auto begin = memory.begin() + static_cast<std::ptrdiff_t>(place * pitch);
+    expected.insert(expected.end(), begin, begin + static_cast<std::ptrdiff_t>(rowBytes));
+  }
+  const auto step = static_cast<std::ptrdiff_t>(pitch);
+  const unsigned char* const first = memory.data() + (isUpwards ? pitch * (rows - 1) : 0);
+  FileHandle file(vorl_detail::OpenFileForWriting(path.c_str()));
+  ASSERT_NE(file, nullptr);
+  ASSERT_EQ(std::fwrite("head", 1, 4, file.get()), 4U);
+  ASSERT_EQ(std::fflush(file.get()), 0);
+  ASSERT_TRUE(WriteFileRows(file.get(), first, isUpwards ? -step : step, rowBytes, rows));
+  file.reset(vorl_detail::OpenFileForReading(path.c_str()));
+  ASSERT_NE(file, nullptr);
+  std::vector<unsigned char> written(expected.size() + 1);
+  written.resize(std::fread(written.data(), 1, written.size(), file.get()));
+  ASSERT_EQ(written, expected);
+}
+
+TEST_F(FileRows, AreWrittenDownwardsAndUpwards) {
+  for (const std::size_t rows : {1U, 2U, 63U, 64U, 65U, 200U}) {
+    for (const std::size_t rowBytes : {1U, 4U, 1000U}) {
+      ASSERT_NO_FATAL_FAILURE(ExpectWritten(m_path, rowBytes, rows, false));
+      ASSERT_NO_FATAL_FAILURE(ExpectWritten(m_path, rowBytes, rows, true));
+    }
+  }
+}
+
+#if defined(__linux__)
+TEST_F(FileRows, FullDevicesTakeNone) {
+  const FileHandle full(vorl_detail::OpenFileForWriting("/dev/full"));
+  ASSERT_NE(full, nullptr);
+  const unsigned char rows[100] = {};
+  EXPECT_FALSE(WriteFileRows(full.get(), rows, 10, 10, 10));
+  EXPECT_TRUE(WriteFileRows(full.get(), rows, 10, 10, 0));
+}
+#endif
 
 }  // namespace

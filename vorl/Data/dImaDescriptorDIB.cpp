@@ -284,15 +284,12 @@ bool dImaDescriptorDIB::WriteInfo(vorl_detail::BitmapFile& file) const {
 }
 
 bool dImaDescriptorDIB::WriteRows(vorl_detail::BitmapFile& file) const {
-  const std::uint64_t memoryRow = MemoryRowBytes();
-  const auto fileRow = static_cast<std::size_t>(FileRowBytes());
-  const auto* pixels = static_cast<const unsigned char*>(m_pixelData);
-  for (std::uint64_t row = RowCount(); row-- > 0;) {
-    if (!file.Write(pixels + row * memoryRow, fileRow)) {
-      return false;
-    }
-  }
-  return true;
+  const auto rows = static_cast<std::size_t>(RowCount());
+  const auto memoryRow = static_cast<std::ptrdiff_t>(MemoryRowBytes());
+  const auto* const pixels = static_cast<const unsigned char*>(m_pixelData);
+  const auto last = static_cast<std::ptrdiff_t>(rows) - 1;
+  return rows == 0 || file.WriteRows(pixels + last * memoryRow, -memoryRow,
+                                     static_cast<std::size_t>(FileRowBytes()), rows);
 }
 
 }  // namespace vorl

@@ -68,6 +68,11 @@ bool BitmapFile::Write(const void* bytes, std::size_t count) {
   return count == 0 || std::fwrite(bytes, 1, count, m_file) == count;
 }
 
+bool BitmapFile::WriteRows(const unsigned char* first, std::ptrdiff_t step, std::size_t rowBytes,
+                           std::size_t rows) {
+  return WriteFileRows(m_file, first, step, rowBytes, rows);
+}
+
 bool BitmapFile::Flush() {
   return std::fflush(m_file) == 0;
 }

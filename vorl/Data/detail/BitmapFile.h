@@ -50,6 +50,9 @@ class BitmapFile {
   bool IsOpen() const { return m_file != nullptr; }
   /// Writes bytes; false when the system did not take them, which may show only later.
   bool Write(const void* bytes, std::size_t count);
+  /// Writes rows that lie `step` bytes apart, behind everything else, which must have been flushed.
+  bool WriteRows(const unsigned char* first, std::ptrdiff_t step, std::size_t rowBytes,
+                 std::size_t rows);
   /// True when everything written so far has reached the system.
   bool Flush();
   /// Closes the file and keeps it; false when the system did not take all.

@@ -113,34 +113,68 @@ bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
   }
   return true;
 }
+
+bool WriteFileRows(std::FILE* file, const unsigned char* first, std::ptrdiff_t step,
+                   std::size_t rowBytes, std::size_t rows) {
+  for (std::size_t i = 0; i < rows; ++i) {
+    const unsigned char* const row = first + step * static_cast<std::ptrdiff_t>(i);
+    if (std::fwrite(row, 1, rowBytes, file) != rowBytes) {
+      return false;
+    }
+  }
+  return true;
+}
 #else
-bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
-                  std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows) {
+namespace {
+
+/// Moves rows by calls of the system that take many pieces of memory at once, and that may stop
+/// anywhere. `move` gets the pieces and how many bytes have been moved, and returns how many more
+/// are.
+template <class Move>
+bool MoveRows(unsigned char* first, std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows,
+              Move move) {
   constexpr std::size_t kAtOnce = 64;
+  std::uint64_t moved = 0;
   std::size_t row = 0;
-  std::size_t filled = 0;  // bytes of that row
+  std::size_t begun = 0;  // bytes of that row
   while (row < rows && rowBytes != 0) {
     iovec parts[kAtOnce];
     const std::size_t count = std::min(kAtOnce, rows - row);
     for (std::size_t i = 0; i < count; ++i) {
-      const std::size_t skipped = i == 0 ? filled : 0;
+      const std::size_t skipped = i == 0 ? begun : 0;
       parts[i].iov_base = first + step * static_cast<std::ptrdiff_t>(row + i) + skipped;
       parts[i].iov_len = rowBytes - skipped;
     }
-    const ssize_t read =
-        preadv(fileno(file), parts, static_cast<int>(count), static_cast<off_t>(position));
-    if (read < 0 && errno == EINTR) {
+    const ssize_t bytes = move(parts, static_cast<int>(count), moved);
+    if (bytes < 0 && errno == EINTR) {
       continue;
     }
-    if (read <= 0) {
+    if (bytes <= 0) {
       return false;
     }
-    position += static_cast<std::uint64_t>(read);
-    filled += static_cast<std::size_t>(read);
-    row += filled / rowBytes;
-    filled %= rowBytes;
+    moved += static_cast<std::uint64_t>(bytes);
+    begun += static_cast<std::size_t>(bytes);
+    row += begun / rowBytes;
+    begun %= rowBytes;
   }
   return true;
+}
+
+}  // namespace
+
+bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
+                  std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows) {
+  return MoveRows(first, step, rowBytes, rows, [&](iovec* parts, int count, std::uint64_t moved) {
+    return preadv(fileno(file), parts, count, static_cast<off_t>(position + moved));
+  });
+}
+
+// Without a position, which not every device has.
+bool WriteFileRows(std::FILE* file, const unsigned char* first, std::ptrdiff_t step,
+                   std::size_t rowBytes, std::size_t rows) {
+  return MoveRows(
+      const_cast<unsigned char*>(first), step, rowBytes, rows,
+      [&](iovec* parts, int count, std::uint64_t) { return writev(fileno(file), parts, count); });
 }
 #endif
 

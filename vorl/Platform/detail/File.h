@@ -36,6 +36,11 @@ bool SeekFile(std::FILE* file, std::uint64_t position);
 bool ReadFileRows(std::FILE* file, std::uint64_t position, unsigned char* first,
                   std::ptrdiff_t step, std::size_t rowBytes, std::size_t rows);
 
+/// The way back: appends rows to what has been written and flushed, without a copy. False when the
+/// system did not take all, which may show only later.
+bool WriteFileRows(std::FILE* file, const unsigned char* first, std::ptrdiff_t step,
+                   std::size_t rowBytes, std::size_t rows);
+
 }  // namespace vorl_detail
 }  // namespace vorl
 
