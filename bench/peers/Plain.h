@@ -32,6 +32,8 @@ void EnterLoop(const Work& work, Loop loop, Check check) {
 
 /// As many bytes copied as the work reads: as many are written, too.
 void EnterMemcpy(const Work& work, const void* source, std::size_t bytes);
+/// The bytes that the work reads, folded into one word: nothing is written.
+void EnterRead(const Work& work, const void* source, std::size_t bytes);
 /// As many bytes set as the work writes.
 void EnterMemset(const Work& work, std::size_t bytes);
 

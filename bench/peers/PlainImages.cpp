@@ -1,7 +1,6 @@
 // Images by loops as one writes them without thinking of speed.
 #include <algorithm>
 #include <array>
-#include <cmath>
 #include <cstring>
 
 #include "Checks.h"
@@ -48,7 +47,7 @@ void EnterExtremes(const ExtremesWork& work) {
         *found = {lowest, highest};
       },
       [=] { return CheckExtremes(work, (*found)[0], (*found)[1]); });
-  EnterMemcpy(work.work, work.samples().data(), work.samples().size() * sizeof(std::uint16_t));
+  EnterRead(work.work, work.samples().data(), work.samples().size() * sizeof(std::uint16_t));
 }
 
 template <class T>
@@ -102,37 +101,6 @@ void EnterStretch(const StretchWork& work) {
 }
 
 }  // namespace
-
-void EnterMemcpy(const Work& work, const void* source, std::size_t bytes) {
-  Enter(work, "memcpy", [=] {
-    const auto target = MakeSamples<std::uint8_t>(bytes);
-    return Contender{[=] {
-                       std::memcpy(target->data(), source, bytes);
-                       return true;
-                     },
-                     [=] {
-                       const bool isEqual = std::memcmp(target->data(), source, bytes) == 0;
-                       return isEqual ? "" : "wrong: not copied";
-                     }};
-  });
-}
-
-void EnterMemset(const Work& work, std::size_t bytes) {
-  static constexpr std::uint8_t kByte = 0x55;
-  Enter(work, "memset", [=] {
-    const auto target = MakeSamples<std::uint8_t>(bytes);
-    return Contender{[=] {
-                       std::memset(target->data(), kByte, bytes);
-                       return true;
-                     },
-                     [=] {
-                       const bool isSet =
-                           std::all_of(target->begin(), target->end(),
-                                       [](std::uint8_t byte) { return byte == kByte; });
-                       return isSet ? "" : "wrong: not set";
-                     }};
-  });
-}
 
 void EnterPlainImages() {
   EnterWindow();

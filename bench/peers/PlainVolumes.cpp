@@ -107,6 +107,27 @@ void EnterCut(const PlaneWork& work) {
       [=] { return CheckPlane(work, pixels->data()); });
 }
 
+/// The sagittal plane with nothing to compute: what it costs to fetch one voxel out of each row.
+void EnterWalk(const PlaneWork& work) {
+  const auto pixels = MakeSamples<std::uint16_t>(kSliceVoxels);
+  const auto voxelOf = [](double position) { return static_cast<std::size_t>(position + 0.5); };
+  Enter(work.work, "walk", [=] {
+    return Contender{[=] {
+                       std::uint16_t* pixel = pixels->data();
+                       const std::size_t column = voxelOf(work.corner[0]);
+                       for (int row = 0; row < work.edge; ++row) {
+                         const std::size_t z = voxelOf(PositionOf(work, 0, row, 0)[2]);
+                         const std::uint16_t* voxel = &Volume()[z * kSliceVoxels + column];
+                         for (int y = 0; y < kHeight; ++y, voxel += kWidth) {
+                           *pixel++ = *voxel;
+                         }
+                       }
+                       return true;
+                     },
+                     [=] { return CheckPlane(work, pixels->data()); }};
+  });
+}
+
 /// Each row of the volume into the pixel or the row of pixels that it lies behind.
 void Project(const DepthWork& work, std::uint16_t* pixels) {
   std::fill_n(pixels, SizeOf(work).width * SizeOf(work).height, std::uint16_t{0});
@@ -161,10 +182,13 @@ void EnterHistogram() {
 void EnterPlainVolumes() {
   for (const PlaneWork& work : PlaneWorks()) {
     EnterCut(work);
+    if (work.work.name == "mpr/nearest/sagittal") {
+      EnterWalk(work);
+    }
   }
   for (const DepthWork& work : DepthWorks()) {
     EnterProject(work);
-    EnterMemcpy(work.work, Volume().data(), kVoxels * sizeof(std::uint16_t));
+    EnterRead(work.work, Volume().data(), kVoxels * sizeof(std::uint16_t));
   }
   EnterHistogram();
   for (const Work& work : {TheHistogram(), TheEdges(), SelectionByValue(), SelectionByEdge()}) {
