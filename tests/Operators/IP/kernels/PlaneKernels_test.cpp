@@ -48,6 +48,8 @@ struct Start {
 
 constexpr Start kStarts[] = {{{kOne, kOne, kOne}, {kOne, 0, 0}},
                              {{3 * kOne + 32768, kOne + 1, 2 * kOne + 65535}, {kOne, 0, 0}},
+                             {{9, 9, 9}, {kOne - 300, 0, 0}},
+                             {{kShape.width * kOne - 1, 9, 9}, {-kOne, 0, 0}},
                              {{9, 9, 9}, {kOne - 300, 900, 1300}},
                              {{kShape.width * kOne - 1, 9, 9}, {-40000, 900, 0}}};
 

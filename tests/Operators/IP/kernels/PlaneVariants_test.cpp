@@ -65,6 +65,37 @@ TEST_P(PlaneVariants, RowsAlongVoxelsEqualThePlainLoops) {
   ForBothTypes<AlongRows>(GetParam());
 }
 
+// Along a row of voxels by a voxel and less, in either direction, and by a little more.
+template <class T>
+struct WithinRows {
+  static void Run(CpuVariant variant) {
+    Sweep<T> sweep(variant, 110);
+    const std::int32_t steps[] = {0, 1, 300, 21845, 32768, kOne / 3 * 2, kOne - 1, kOne, kOne + 1};
+    for (int width = 2; width <= kWidest; ++width) {
+      for (const std::int32_t step : steps) {
+        const Shape shape{width, sweep.Between(1, 3), sweep.Between(1, 3), sweep.Alignment()};
+        sweep.Check(shape, {0, 65535 >> std::is_signed_v<T>, true}, sweep.Side(), 2, [&] {
+          RowCase row;
+          row.point = sweep.Point(shape);
+          row.step = {sweep.random() % 2 != 0 ? step : -step, 0, 0};
+          if (sweep.random() % 2 != 0) {  // from one end of the row towards the other
+            row.point.x = row.step.x < 0 ? width * kOne - 1 : 0;
+          }
+          row.depth = sweep.Depth(shape);
+          row.width = static_cast<std::size_t>(sweep.Between(0, 2 * kWidest));
+          row.shift = sweep.random() % 32;
+          return row;
+        });
+      }
+    }
+    EXPECT_GT(sweep.tally.done, 20 * sweep.tally.left);
+  }
+};
+
+TEST_P(PlaneVariants, RowsWithinARowOfVoxelsEqualThePlainLoops) {
+  ForBothTypes<WithinRows>(GetParam());
+}
+
 // More registers than the kernels do between two looks at the values: few of those have no room.
 template <class T>
 struct LongRows {

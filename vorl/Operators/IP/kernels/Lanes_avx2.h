@@ -116,6 +116,23 @@ class Words {
     StoreBytes(_mm256_srli_epi16(low.m_lanes, 8), _mm256_srli_epi16(high.m_lanes, 8), target);
   }
 
+  /// The high halves of 32-bit lanes, those of `low` first.
+  static Words HighHalves(const Numbers& low, const Numbers& high) {
+    const __m256i mixed = _mm256_packus_epi32(_mm256_srli_epi32(low.m_lanes, 16),
+                                              _mm256_srli_epi32(high.m_lanes, 16));
+    return _mm256_permute4x64_epi64(mixed, 0xD8);
+  }
+  /// From a register full of samples those at the lanes of `index`.
+  static Words Chosen(const void* samples, const Words& index) {
+    const __m256i all = Load(samples).m_lanes;
+    const __m256i bytes = _mm256_add_epi16(
+        _mm256_mullo_epi16(index.m_lanes, _mm256_set1_epi16(0x0202)), _mm256_set1_epi16(0x0100));
+    const __m256i lower = _mm256_shuffle_epi8(_mm256_permute2x128_si256(all, all, 0x00), bytes);
+    const __m256i upper = _mm256_shuffle_epi8(_mm256_permute2x128_si256(all, all, 0x11), bytes);
+    const __m256i isUpper = _mm256_cmpgt_epi16(index.m_lanes, _mm256_set1_epi16(7));
+    return _mm256_blendv_epi8(lower, upper, isUpper);
+  }
+
   Words() = default;
 
   Words operator+(const Words& other) const { return _mm256_add_epi16(m_lanes, other.m_lanes); }

@@ -112,6 +112,18 @@ class Words {
     StoreBytes(_mm512_srli_epi16(low.m_lanes, 8), _mm512_srli_epi16(high.m_lanes, 8), target);
   }
 
+  /// The high halves of 32-bit lanes, those of `low` first.
+  static Words HighHalves(const Numbers& low, const Numbers& high) {
+    const __m512i pairs = _mm512_setr_epi32(
+        0x030001, 0x070005, 0x0B0009, 0x0F000D, 0x130011, 0x170015, 0x1B0019, 0x1F001D, 0x230021,
+        0x270025, 0x2B0029, 0x2F002D, 0x330031, 0x370035, 0x3B0039, 0x3F003D);
+    return _mm512_permutex2var_epi16(low.m_lanes, pairs, high.m_lanes);
+  }
+  /// From a register full of samples those at the lanes of `index`.
+  static Words Chosen(const void* samples, const Words& index) {
+    return _mm512_permutexvar_epi16(index.m_lanes, _mm512_loadu_si512(samples));
+  }
+
   Words() = default;
 
   Words operator+(const Words& other) const { return _mm512_add_epi16(m_lanes, other.m_lanes); }

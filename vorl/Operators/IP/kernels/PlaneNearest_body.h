@@ -64,6 +64,37 @@ class NearestGatherer {
   Numbers m_lastColumn, m_lastPair, m_width;
 };
 
+/// True for points along a row of voxels that are at most a voxel apart.
+bool IsWithinRow(const FixedVector& step) {
+  return step.y == 0 && step.z == 0 && step.x >= -kOneVoxel && step.x <= kOneVoxel;
+}
+
+/// Such points, in a row of at least a register of voxels: the voxels of a register of points lie
+/// in one register, too.
+template <class T, class Sink>
+void NearestWithinRow(const T* voxels, std::int32_t width, std::int32_t x, std::int32_t step,
+                      std::size_t count, const Sink& sink) {
+  constexpr auto kCount = static_cast<std::int32_t>(Words::kCount);
+  const std::int32_t lastBegin = width - kCount;
+  const Numbers toHigh = Numbers::All(step * (kCount / 2));
+  const Numbers toNext = Numbers::All(step * kCount);
+  Numbers low = Numbers::All(x) + Numbers::Lanes() * Numbers::All(step);
+  std::size_t i = 0;
+  for (; i + Words::kCount <= count; i += Words::kCount) {
+    const std::int32_t first = x >> 16;
+    const std::int32_t last = (x + step * (kCount - 1)) >> 16;
+    const std::int32_t leftmost = first < last ? first : last;
+    const std::int32_t begin = leftmost < lastBegin ? leftmost : lastBegin;
+    const Words columns = Words::HighHalves(low, low + toHigh);
+    sink.Put(i, Words::Chosen(voxels + begin, columns - Words::All(begin)));
+    low = low + toNext;
+    x += step * kCount;
+  }
+  for (; i < count; ++i, x += step) {
+    sink.Put(i, voxels[x >> 16]);
+  }
+}
+
 /// Inside points have no sign, so the shifts may be logical.
 ///
 /// A single layer is fetched voxel by voxel: most are not in the cache, and a gathering waits for
@@ -84,6 +115,9 @@ void NearestRow(const VolumeGrid& grid, const FixedVector& point, const FixedVec
     for (; i < count; ++i) {
       sink.Put(i, row[i]);
     }
+  } else if (IsWithinRow(step) && width >= Words::kCount) {
+    NearestWithinRow(SliceOf<T>(grid, place.z) + (place.y >> 16) * width, grid.Width(), point.x,
+                     step.x, count, sink);
   } else if constexpr (Sink::kCollects) {
     GatherRow(NearestGatherer<T>(grid), point, step, count, sink);
   } else if (step.z == 0) {
