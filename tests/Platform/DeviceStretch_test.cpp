@@ -147,4 +147,31 @@ TEST(DeviceStretch, EveryPixelIsTheOneThatTheModelTakes) {
   }
 }
 
+// Pictures from a size on are written past the caches; their parts are not.
+TEST(DeviceStretch, AsAWholeALargePictureIsWhatItsPartsAre) {
+  g_random.seed(16);
+  constexpr int kWidth = 2064;
+  constexpr int kHeight = 2100;
+  const Picture picture(1900, 2000, 32);
+  TestInfo& info = const_cast<TestInfo&>(picture.info);
+  TestSection whole(kWidth, -kHeight, 32);
+  TestSection parts(kWidth, -kHeight, 32);
+  ASSERT_GT(whole.Bytes(), std::size_t{1} << 24);
+  const auto stretch = [&](const TestSection& target) {
+    SetStretchBltMode(target.dc, COLORONCOLOR);
+    StretchDIBits(target.dc, 0, 0, kWidth, kHeight, 0, 0, 1900, 2000, picture.bits.data(),
+                  info.Get(), DIB_RGB_COLORS, SRCCOPY);
+  };
+  stretch(whole);
+  for (int top = 0; top < kHeight; top += 700) {
+    SaveDC(parts.dc);
+    IntersectClipRect(parts.dc, 0, top, kWidth, top + 700);
+    stretch(parts);
+    RestoreDC(parts.dc, -1);
+  }
+  EXPECT_EQ(std::memcmp(whole.pixels, parts.pixels, whole.Bytes()), 0);
+  EXPECT_EQ(whole.At(0, 0), picture.At(0, 0));
+  EXPECT_EQ(whole.At(kWidth - 1, kHeight - 1), picture.At(1899, 1999));
+}
+
 }  // namespace

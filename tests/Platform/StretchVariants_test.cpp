@@ -57,6 +57,27 @@ class StretchVariants : public testing::TestWithParam<CpuVariant> {
     plan.Gather(source.get(), target.data() + kGuard + misalignment);
     ASSERT_EQ(target, expected) << columns.size() << " of " << sourceCount << " units of " << bytes
                                 << " bytes, " << misalignment << " off";
+    ExpectStreamed(plan, source.get(), bytes,
+                   {expected.begin() + static_cast<std::ptrdiff_t>(kGuard + misalignment),
+                    expected.end() - kGuard});
+  }
+
+  // Only to a cache line, and only where there is a loop for it.
+  void ExpectStreamed(const GatherPlan& plan, const std::uint8_t* source, int bytes,
+                      const std::vector<std::uint8_t>& expected) {
+    std::vector<std::uint8_t> target(kGuard + expected.size() + 2 * kGuard, 0xA5);
+    const auto address = reinterpret_cast<std::uintptr_t>(target.data());
+    const std::size_t place = kGuard + (64 - address % 64) % 64;
+    EXPECT_FALSE(plan.Stream(source, target.data() + place + 16));
+    const bool canStream = GetParam() != CpuVariant::Reference && bytes == 4;
+    ASSERT_EQ(plan.Stream(source, target.data() + place), canStream);
+    Kernels().endStream();
+    std::vector<std::uint8_t> whole(target.size(), 0xA5);
+    if (canStream) {
+      std::copy(expected.begin(), expected.end(),
+                whole.begin() + static_cast<std::ptrdiff_t>(place));
+    }
+    ASSERT_EQ(target, whole) << expected.size() / 4 << " units";
   }
 };
 

@@ -47,8 +47,18 @@ class RowSource {
                      m_repeats ? m_targetBytes : source.surface.format.BytesPerUnit(),
                      ActiveStretchKernels());
     }
+    const std::uint64_t columns = m_columns.size();
+    m_isLarge = columns * static_cast<unsigned>(m_targetBytes) * y.first.size() >= kLargeTarget;
     m_combines = (m_mode == BLACKONWHITE || m_mode == WHITEONBLACK) &&
                  (x.first != x.last || y.first != y.last);
+  }
+
+  RowSource(const RowSource&) = delete;
+  RowSource& operator=(const RowSource&) = delete;
+  ~RowSource() {
+    if (m_hasStreamed) {
+      ActiveStretchKernels().endStream();
+    }
   }
 
   /// The units for the columns from x.begin to x.end of a target row; valid until the next call.
@@ -60,6 +70,7 @@ class RowSource {
     if (m_current == nullptr || first != m_firstRow || last != m_lastRow) {
       m_firstRow = first;
       m_lastRow = last;
+      m_isShownOnce = m_isLarge && k + 1 < m_y.first.size() && m_y.first[k + 1] != first;
       m_current = m_combines ? Combined(first, last) : Single(first, place);
     }
     return m_current;
@@ -74,6 +85,10 @@ class RowSource {
   }
 
  private:
+  // What is larger than most caches is written past them: otherwise the memory is read before it is
+  // written. 2048 x 2048 pixels of 32 bits to 3840 x 2160: 4820 instead of 4084 million a second.
+  static constexpr std::uint64_t kLargeTarget = std::uint64_t{1} << 24;
+
   const std::uint8_t* SourceUnits(int row) {
     const std::uint8_t* pixels = m_surface.Row(row);
     const int depth = m_surface.format.depth;
@@ -101,6 +116,10 @@ class RowSource {
   const std::uint8_t* Stretched(const std::uint8_t* units, int bytes, std::uint8_t* place) {
     if (!m_plan) {
       return units;
+    }
+    if (place != nullptr && m_isShownOnce && m_plan->Stream(units, place)) {
+      m_hasStreamed = true;
+      return place;
     }
     if (place == nullptr) {
       m_stretched.resize(m_columns.size() * static_cast<std::size_t>(bytes));
@@ -160,6 +179,9 @@ class RowSource {
   bool m_repeats = false;      // fewer source than target columns
   std::optional<GatherPlan> m_plan;
   bool m_combines = false;
+  bool m_isLarge = false;      // the target
+  bool m_isShownOnce = false;  // the current row of a large target is not copied to the next one
+  bool m_hasStreamed = false;
   int m_firstRow = 0;
   int m_lastRow = 0;
   const std::uint8_t* m_current = nullptr;

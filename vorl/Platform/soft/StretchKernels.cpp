@@ -45,8 +45,8 @@ void MapTo32RunRef(const std::uint8_t* source, std::uint8_t* target, std::size_t
 
 namespace {
 
-constexpr StretchKernels kStretchKernelsRef = {&GatherRunRef<1>, 0, &GatherRunRef<4>, 0,
-                                               &MapTo32RunRef};
+constexpr StretchKernels kStretchKernelsRef = {
+    &GatherRunRef<1>, 0, &GatherRunRef<4>, 0, &MapTo32RunRef, nullptr, [] {}};
 
 GatherRun* GatherFor(int bytes, const StretchKernels& kernels) {
   switch (bytes) {
@@ -90,7 +90,7 @@ const StretchKernels& ActiveStretchKernels() {
 
 GatherPlan::GatherPlan(const std::vector<int>& columns, int sourceCount, int bytes,
                        const StretchKernels& kernels)
-    : m_gather(GatherFor(bytes, kernels)) {
+    : m_gather(GatherFor(bytes, kernels)), m_stream(bytes == 4 ? kernels.stream4 : nullptr) {
   m_blocks.columns = columns.data();
   m_blocks.count = columns.size();
   const std::size_t block = BlockOf(bytes, kernels);
@@ -122,6 +122,15 @@ void GatherPlan::Prepare(std::size_t sourceCount, std::size_t block) {
 
 void GatherPlan::Gather(const std::uint8_t* units, std::uint8_t* target) const {
   m_gather(units, m_blocks, target);
+}
+
+bool GatherPlan::Stream(const std::uint8_t* units, std::uint8_t* target) const {
+  constexpr std::uintptr_t kCacheLine = 64;
+  if (m_stream == nullptr || reinterpret_cast<std::uintptr_t>(target) % kCacheLine != 0) {
+    return false;
+  }
+  m_stream(units, m_blocks, target);
+  return true;
 }
 
 }  // namespace vorl_detail

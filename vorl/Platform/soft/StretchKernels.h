@@ -56,6 +56,8 @@ struct StretchKernels {
   GatherRun* gather4;  ///< units of 4 bytes
   std::size_t block4;  ///< its units in a register
   MapTo32Run* mapTo32;
+  GatherRun* stream4;   ///< `gather4` past the caches, to targets at a cache line; may be null
+  void (*endStream)();  ///< to be called before anyone else looks at what was streamed
 };
 
 /// The loops of a variant that can run here (see `CanRun`).
@@ -74,11 +76,15 @@ class GatherPlan {
 
   /// `units` are all the source units; they do not overlap with the target.
   void Gather(const std::uint8_t* units, std::uint8_t* target) const;
+  /// The same past the caches, for a target that they would not keep. False, and nothing is done,
+  /// where there is no way. `StretchKernels::endStream` must follow.
+  bool Stream(const std::uint8_t* units, std::uint8_t* target) const;
 
  private:
   void Prepare(std::size_t sourceCount, std::size_t block);
 
   GatherRun* m_gather;
+  GatherRun* m_stream;
   std::vector<int> m_firsts;
   std::vector<std::uint8_t> m_offsets;
   GatherBlocks m_blocks;

@@ -7,6 +7,7 @@ namespace vorl_detail {
 namespace {
 
 struct Register1 {
+  using Units = __m128i;
   static constexpr std::size_t kCount = 16;
 
   static __m128i Load(const std::uint8_t* units) {
@@ -21,6 +22,7 @@ struct Register1 {
 };
 
 struct Register4 {
+  using Units = __m256i;
   static constexpr std::size_t kCount = 8;
 
   static __m256i Chosen(const std::uint8_t* units, const std::uint8_t* offsets) {
@@ -31,7 +33,14 @@ struct Register4 {
   static void Store(__m256i units, std::uint8_t* target) {
     _mm256_storeu_si256(reinterpret_cast<__m256i*>(target), units);
   }
+  static void Stream(__m256i units, std::uint8_t* target) {
+    _mm256_stream_si256(reinterpret_cast<__m256i*>(target), units);
+  }
 };
+
+void EndStream() {
+  _mm_sfence();
+}
 
 // No faster way is known here: gathering from memory takes as long, on some machines much longer.
 void MapTo32(const std::uint8_t* source, std::uint8_t* target, std::size_t count,

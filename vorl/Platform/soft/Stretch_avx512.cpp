@@ -7,6 +7,7 @@ namespace vorl_detail {
 namespace {
 
 struct Register1 {
+  using Units = __m512i;
   static constexpr std::size_t kCount = 64;
 
   static __m512i Chosen(const std::uint8_t* units, const std::uint8_t* offsets) {
@@ -16,6 +17,7 @@ struct Register1 {
 };
 
 struct Register4 {
+  using Units = __m512i;
   static constexpr std::size_t kCount = 16;
 
   static __m512i Chosen(const std::uint8_t* units, const std::uint8_t* offsets) {
@@ -23,7 +25,14 @@ struct Register4 {
     return _mm512_permutexvar_epi32(_mm512_cvtepu8_epi32(bytes), _mm512_loadu_si512(units));
   }
   static void Store(__m512i units, std::uint8_t* target) { _mm512_storeu_si512(target, units); }
+  static void Stream(__m512i units, std::uint8_t* target) {
+    _mm512_stream_si512(reinterpret_cast<__m512i*>(target), units);
+  }
 };
+
+void EndStream() {
+  _mm_sfence();
+}
 
 // A table of 256 bytes in four registers.
 struct Plane {
