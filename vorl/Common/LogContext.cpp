@@ -57,7 +57,6 @@ void LogContext::Init(const char* title, const char* filePath, int line, bool lo
   m_initLine = m_line;
   StoreText(m_title, title != nullptr ? title : "");
   m_filePath = filePath != nullptr ? filePath : "";
-  m_fileName = FileNameOf(m_filePath);
   m_code = 0;
   m_logTime = SecondsNow();
   m_logThread = GetLogManager().GetLogThread();
@@ -155,7 +154,7 @@ const char* LogContext::GetFilePath() const {
   return m_filePath;
 }
 const char* LogContext::GetFileName() const {
-  return m_fileName;
+  return FileNameOf(m_filePath);  // seldom asked, unlike a context made
 }
 unsigned int LogContext::GetLineNo() const {
   return m_line;

@@ -89,7 +89,6 @@ class VORL_API LogContext {
   std::int32_t m_code = 0;
   std::string m_title;
   const char* m_filePath = "";
-  const char* m_fileName = "";
   std::uint32_t m_line = 0;
   std::uint32_t m_initLine = 0;
   double m_logTime = 0.0;

@@ -57,6 +57,11 @@ struct KillTarget {
   volatile sig_atomic_t pending = 0;   // 1 when a shield put the end off
 };
 
+// Placed when the library is loaded: a signal handler must not be the first to ask for it, and
+// every log context asks several times.
+#if defined(__GNUC__)
+[[gnu::tls_model("initial-exec")]]
+#endif
 thread_local KillTarget killTarget;
 
 int KillSignal() {
