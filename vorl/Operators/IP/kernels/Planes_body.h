@@ -5,8 +5,8 @@
 //    neighbours are loaded, and interpolated in 16 bits where the samples leave room for it
 //    (PlaneAlongRow_body.h).
 // 2. Elsewhere the interpolation gathers pairs of neighbours (PlaneLinear_body.h).
-// 3. The nearest voxels of points within a row of voxels are chosen in registers; elsewhere those of
-//    slabs are gathered, those of planes fetched one by one (PlaneNearest_body.h).
+// 3. The nearest voxels of points within a row of voxels are chosen in registers; elsewhere those
+//    of slabs are gathered, those of planes fetched one by one (PlaneNearest_body.h).
 // 4. The largest voxel of a slab along the grid is found in 16 bits (PlaneMaximum_body.h).
 //
 // Nothing that is inline elsewhere, too, is called here: it might be compiled for a machine that
