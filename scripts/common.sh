@@ -8,7 +8,6 @@ cd "$(dirname "${BASH_SOURCE[0]}")/.."
 # Scripts that call each other share one clock.
 export VORL_SCRIPT_START="${VORL_SCRIPT_START:-$(date +%s)}"
 jobs="$(nproc 2>/dev/null || echo 2)"
-test_jobs=$((2 * jobs))  # many tests wait for others more than they compute
 
 step() {
   local seconds=$(($(date +%s) - VORL_SCRIPT_START))
@@ -37,5 +36,5 @@ build() {
 # run_tests PRESET [CTEST_ARGUMENT...]
 run_tests() {
   step "Testing the preset '$1'"
-  ctest --parallel "$test_jobs" --preset "$@"
+  ctest --parallel "$jobs" --preset "$@"
 }

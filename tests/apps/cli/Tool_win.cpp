@@ -3,6 +3,7 @@
 #include <array>
 #include <memory>
 #include <stdexcept>
+#include <string>
 #include <thread>
 
 #include <windows.h>
@@ -103,9 +104,14 @@ Handle Start(const Arguments& arguments, HANDLE output, HANDLE errors) {
   startup.hStdOutput = output;
   startup.hStdError = errors;
   PROCESS_INFORMATION process{};
-  if (!CreateProcessA(VORL_TOOL, commandLine.data(), nullptr, nullptr, TRUE, 0, nullptr, nullptr,
-                      &startup, &process)) {
-    throw std::runtime_error("the tool can't be started");
+  // An emulated system at times starts no process, for reasons of its own, and then the next one.
+  for (int attempts = 3; !CreateProcessA(VORL_TOOL, commandLine.data(), nullptr, nullptr, TRUE, 0,
+                                         nullptr, nullptr, &startup, &process);) {
+    const DWORD error = GetLastError();
+    if (--attempts == 0) {
+      throw std::runtime_error("the tool can't be started: error " + std::to_string(error));
+    }
+    Sleep(500);
   }
   CloseHandle(process.hThread);
   return Handle(process.hProcess);
