@@ -4,6 +4,7 @@
 #include <vorl/Platform/soft/StretchKernels.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/VariantTest.h>
 
 #include <algorithm>
 #include <memory>
@@ -20,13 +21,8 @@ using vorl_detail::PixelTable;
 constexpr int kLongest = 4 * 64 + 1;  // four AVX-512 registers of bytes, and one byte
 constexpr std::size_t kGuard = 64;
 
-class StretchVariants : public testing::TestWithParam<CpuVariant> {
+class StretchVariants : public VariantTest {
  protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
   const vorl_detail::StretchKernels& Kernels() const {
     return vorl_detail::StretchKernelsOf(GetParam());
   }
@@ -82,9 +78,7 @@ class StretchVariants : public testing::TestWithParam<CpuVariant> {
 };
 
 INSTANTIATE_TEST_SUITE_P(, StretchVariants, testing::ValuesIn(vorl_detail::kCpuVariants),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 // Of every count, from a few source units to more than are shown.
 TEST_P(StretchVariants, StretchedRowsAreTheUnitsOfTheirColumns) {

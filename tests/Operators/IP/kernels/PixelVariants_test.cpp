@@ -6,6 +6,7 @@
 
 #include <gtest/gtest.h>
 #include <tests/Support/GuardPages.h>
+#include <tests/Support/VariantTest.h>
 
 #include <algorithm>
 #include <limits>
@@ -28,20 +29,13 @@ using vorl_detail::WindowRamp;
 constexpr std::size_t kLongest = 4 * 64 + 1;
 constexpr std::size_t kGuard = 64;
 
-class PixelVariants : public testing::TestWithParam<CpuVariant> {
+class PixelVariants : public VariantTest {
  protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
   const PixelKernels& Kernels() const { return vorl_detail::PixelKernelsOf(GetParam()); }
 };
 
 INSTANTIATE_TEST_SUITE_P(, PixelVariants, testing::ValuesIn(vorl_detail::kCpuVariants),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 template <class T>
 std::vector<T> RandomSamples(std::size_t count, std::mt19937& random) {

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 #include <tests/Support/Allocation.h>
+#include <tests/Support/VariantTest.h>
 
 #include <algorithm>
 #include <cstdint>
@@ -24,19 +25,10 @@ using vorl_detail::PlaneKernels;
 using vorl_detail::RowSink;
 using vorl_detail::VolumeGrid;
 
-class PlaneKernelsTest : public testing::TestWithParam<CpuVariant> {
- protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
-};
+class PlaneKernelsTest : public VariantTest {};
 
 INSTANTIATE_TEST_SUITE_P(, PlaneKernelsTest, testing::Values(CpuVariant::Avx2, CpuVariant::Avx512),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 // A volume in whose middle every step of a row of kWidest points stays.
 constexpr Shape kShape{kWidest + 4, 4, 4, 16};

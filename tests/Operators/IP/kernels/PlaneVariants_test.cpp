@@ -4,6 +4,7 @@
 #include <vorl/Operators/IP/kernels/PlaneRows.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/VariantTest.h>
 
 #include <cstdint>
 #include <iterator>
@@ -15,19 +16,10 @@ namespace {
 
 using namespace plane_sweep;
 
-class PlaneVariants : public testing::TestWithParam<CpuVariant> {
- protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
-};
+class PlaneVariants : public VariantTest {};
 
 INSTANTIATE_TEST_SUITE_P(, PlaneVariants, testing::Values(CpuVariant::Avx2, CpuVariant::Avx512),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 // ---- Along rows of voxels --------------------------------------------------------------------
 

@@ -5,6 +5,7 @@
 #include <vorl/Operators/IP/kernels/SlabBands.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/VariantTest.h>
 
 #include <atomic>
 #include <cstddef>
@@ -23,19 +24,10 @@ using vorl_detail::RowSampler;
 using vorl_detail::RowSink;
 using vorl_detail::SlabBands;
 
-class SlabBandVariants : public testing::TestWithParam<CpuVariant> {
- protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
-};
+class SlabBandVariants : public VariantTest {};
 
 INSTANTIATE_TEST_SUITE_P(, SlabBandVariants, testing::Values(CpuVariant::Avx2, CpuVariant::Avx512),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 /// Whether a coordinate of the row's slab wraps, so that the plain loop is to do it.
 bool Wraps(const Picture& picture, const FixedVector& start) {

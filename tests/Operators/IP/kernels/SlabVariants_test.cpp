@@ -5,6 +5,7 @@
 #include <vorl/Operators/IP/kernels/PlaneRows.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/VariantTest.h>
 
 #include <cstddef>
 #include <cstdint>
@@ -20,19 +21,10 @@ namespace {
 
 using namespace slab_pictures;
 
-class SlabVariants : public testing::TestWithParam<CpuVariant> {
- protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
-};
+class SlabVariants : public VariantTest {};
 
 INSTANTIATE_TEST_SUITE_P(, SlabVariants, testing::Values(CpuVariant::Avx2, CpuVariant::Avx512),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+                         &VariantName);
 
 /// Whether any row's coordinates wrap in the directions in which its points differ.
 bool WrapsAlongRows(const Picture& picture) {

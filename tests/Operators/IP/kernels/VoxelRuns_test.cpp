@@ -4,6 +4,7 @@
 #include <vorl/Operators/IP/kernels/VoxelRuns.h>
 
 #include <gtest/gtest.h>
+#include <tests/Support/VariantTest.h>
 
 #include <algorithm>
 #include <cstring>
@@ -22,13 +23,8 @@ using vorl_detail::ValueCounter;
 constexpr std::size_t kLongest = 4 * 32 + 1;  // four AVX-512 registers of 16-bit values, and one
 constexpr std::size_t kGuard = 32;
 
-class VoxelRuns : public testing::TestWithParam<CpuVariant> {
+class VoxelRuns : public VariantTest {
  protected:
-  void SetUp() override {
-    if (!vorl_detail::CanRun(GetParam())) {
-      GTEST_SKIP() << "this machine has no " << vorl_detail::NameOf(GetParam());
-    }
-  }
   const vorl_detail::VoxelKernels& Kernels() const {
     return vorl_detail::VoxelKernelsOf(GetParam());
   }
@@ -43,10 +39,7 @@ class VoxelRuns : public testing::TestWithParam<CpuVariant> {
   std::mt19937 m_random{401};
 };
 
-INSTANTIATE_TEST_SUITE_P(, VoxelRuns, testing::ValuesIn(vorl_detail::kCpuVariants),
-                         [](const auto& variant) {
-                           return std::string(vorl_detail::NameOf(variant.param));
-                         });
+INSTANTIATE_TEST_SUITE_P(, VoxelRuns, testing::ValuesIn(vorl_detail::kCpuVariants), &VariantName);
 
 TEST_P(VoxelRuns, EdgeClassesAreTheRiseAboveTheLowerNeighbour) {
   for (std::size_t count = 0; count <= kLongest; ++count) {
