@@ -77,23 +77,13 @@ void Check(const VolumeView& view, CpuVariant variant, const Picture& picture, R
 /// Random pictures that `next` makes, in random volumes, in all ways.
 template <class T, class Next>
 void SweepPictures(CpuVariant variant, unsigned seed, int count, Tally& tally, Next&& next) {
-  Sweep<T> sweep(variant, seed);
-  const auto kinds = AllValues<T>();
-  for (int i = 0; i < count && !testing::Test::HasFailure(); ++i) {
-    const Shape shape{sweep.random() % 8 == 0 ? sweep.Between(1, 4) : sweep.Between(2, 140),
-                      sweep.Between(1, 30), sweep.Between(1, 20), sweep.Alignment()};
-    const Values& values = kinds[sweep.random() % kinds.size()];
-    std::ostringstream text;
-    text << vorl_detail::NameOf(variant) << ", seed " << seed << ", "
-         << (std::is_signed_v<T> ? "signed " : "unsigned ") << values << ", " << shape;
-    SCOPED_TRACE(text.str());
-    const GuardedVolume<T> volume(shape, values, sweep.Side(), sweep.random);
-    const Picture picture = next(sweep, shape);
-    for (const RowSink sink : {RowSink::Maximum, RowSink::Sum}) {
-      Check<T, vorl_detail::NearestSampler<T>>(volume.View(), variant, picture, sink, tally);
-      Check<T, vorl_detail::TrilinearSampler<T>>(volume.View(), variant, picture, sink, tally);
-    }
-  }
+  ForEachPicture<T>(
+      variant, seed, count, next, [&](const VolumeView& view, const Picture& picture) {
+        for (const RowSink sink : {RowSink::Maximum, RowSink::Sum}) {
+          Check<T, vorl_detail::NearestSampler<T>>(view, variant, picture, sink, tally);
+          Check<T, vorl_detail::TrilinearSampler<T>>(view, variant, picture, sink, tally);
+        }
+      });
 }
 
 // More columns than a piece has, more layers, and more rows than a band.
@@ -124,7 +114,7 @@ TEST_P(SlabBandVariants, PicturesInAnyDirectionEqualThePlainLoops) {
   ForBothTypes<AnyDirection>(GetParam());
 }
 
-// Row after row moves on until its end, and then its begin, lies beyond 2^31.
+// Row after row moves on until one begins before 2^31 and ends behind it.
 template <class T>
 struct WrappingRows {
   static void Run(CpuVariant variant) {
@@ -133,9 +123,12 @@ struct WrappingRows {
       Picture picture;
       picture.width = 20;
       picture.height = 90;
-      picture.start = {sweep.Between(0, 5) * kOne, sweep.Fraction(), sweep.Fraction()};
+      const std::int32_t rowStep = sweep.Between(600, 900);
+      const std::int32_t wrappingRow = sweep.Between(20, 40);
+      picture.start = {(32767 - sweep.Between(0, 8) - wrappingRow * rowStep) * kOne,
+                       sweep.Fraction(), sweep.Fraction()};
       picture.columnStep = {kOne / 2, 0, 0};
-      picture.rowStep = {sweep.Between(600, 900) * kOne, 0, 0};
+      picture.rowStep = {rowStep * kOne, 0, 0};
       picture.depth = {kOne, kOne, 0};
       return picture;
     });

@@ -7,9 +7,13 @@
 #include <vorl/Operators/IP/kernels/Slab.h>
 #include <vorl/Operators/IP/kernels/SlicePlane.h>
 
+#include <gtest/gtest.h>
+
 #include <cstddef>
 #include <cstdint>
 #include <ostream>
+#include <sstream>
+#include <type_traits>
 
 #include "PlaneSweep.h"
 
@@ -44,6 +48,25 @@ inline SlicePlane PlaneOf(const Picture& picture) {
   plane.rowStep = picture.rowStep;
   plane.depthStep = picture.depth;
   return plane;
+}
+
+/// Calls `check(volume, picture)` for so many pictures that `next(sweep, shape)` makes, each in a
+/// random volume of its own, until one fails.
+template <class T, class Next, class Check>
+void ForEachPicture(CpuVariant variant, unsigned seed, int count, Next&& next, Check&& check) {
+  Sweep<T> sweep(variant, seed);
+  const auto kinds = AllValues<T>();
+  for (int i = 0; i < count && !testing::Test::HasFailure(); ++i) {
+    const Shape shape{sweep.random() % 4 == 0 ? sweep.Between(1, 5) : sweep.Between(2, 140),
+                      sweep.Between(1, 30), sweep.Between(1, 20), sweep.Alignment()};
+    const Values& values = kinds[sweep.random() % kinds.size()];
+    std::ostringstream text;
+    text << vorl_detail::NameOf(variant) << ", seed " << seed << ", "
+         << (std::is_signed_v<T> ? "signed " : "unsigned ") << values << ", " << shape;
+    SCOPED_TRACE(text.str());
+    const GuardedVolume<T> volume(shape, values, sweep.Side(), sweep.random);
+    check(volume.View(), next(sweep, shape));
+  }
 }
 
 }  // namespace slab_pictures

@@ -72,22 +72,16 @@ void Check(const VolumeView& view, CpuVariant variant, const Picture& picture, b
 template <class T, class Next>
 void SweepPictures(CpuVariant variant, unsigned seed, int count, bool isOnGrid, Tally& tally,
                    Next&& next) {
-  Sweep<T> sweep(variant, seed);
-  const auto kinds = AllValues<T>();
-  for (int i = 0; i < count && !testing::Test::HasFailure(); ++i) {
-    const Shape shape{sweep.random() % 4 == 0 ? sweep.Between(1, 5) : sweep.Between(2, 140),
-                      sweep.Between(1, 20), sweep.Between(1, 12), sweep.Alignment()};
-    const Values& values = kinds[sweep.random() % kinds.size()];
-    std::ostringstream text;
-    text << vorl_detail::NameOf(variant) << ", seed " << seed << ", "
-         << (std::is_signed_v<T> ? "signed " : "unsigned ") << values << ", " << shape;
-    SCOPED_TRACE(text.str());
-    const GuardedVolume<T> volume(shape, values, sweep.Side(), sweep.random);
+  const auto withSteps = [&](Sweep<T>& sweep, const Shape& shape) {
     Picture picture = next(sweep, shape);
     picture.depthSteps = sweep.random() % 4 == 0 ? sweep.Between(2, 70) : sweep.Between(2, 9);
     picture.height = sweep.random() % 4 == 0 ? sweep.Between(15, 36) : sweep.Between(1, 6);
-    Check<T>(volume.View(), variant, picture, isOnGrid, tally);
-  }
+    return picture;
+  };
+  ForEachPicture<T>(variant, seed, count, withSteps,
+                    [&](const VolumeView& view, const Picture& picture) {
+                      Check<T>(view, variant, picture, isOnGrid, tally);
+                    });
 }
 
 // Through all of the axis and beyond, from any place, in either direction.
