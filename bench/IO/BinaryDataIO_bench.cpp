@@ -4,37 +4,22 @@
 #include <vorl/IO/BinaryDataIO.h>
 
 #include <cstdio>
-#include <vector>
 
 #include "../Fixtures.h"
+#include "../ImageStudy.h"
 #include "../ScratchFile.h"
 
 namespace {
 
-class Study : public IBinaryDataIO {
+class Study : public bench::ImageStudy {
  public:
-  Study() : m_images(bench::Shrunk(300)) {}
+  Study() : ImageStudy(static_cast<std::size_t>(bench::Shrunk(300))) {}
 
-  void Write(BinaryDataOut& out) override {
-    for (dImage& image : m_images) {
-      out.Write(&image);
-    }
-  }
-  void Read(BinaryDataIn& in) override {
-    for (dImage& image : m_images) {
-      in.Read(&image);
-    }
-  }
-
-  std::vector<dImage>& Images() { return m_images; }
   void Fill() {
-    for (dImage& image : m_images) {
+    for (dImage& image : Images()) {
       bench::MakeImage(image, 512, ImageDataType_U16);
     }
   }
-
- private:
-  std::vector<dImage> m_images;
 };
 
 void Report(benchmark::State& state, Study& study) {

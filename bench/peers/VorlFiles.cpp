@@ -6,6 +6,7 @@
 #include <memory>
 #include <vector>
 
+#include "../ImageStudy.h"
 #include "../ScratchFile.h"
 #include "Checks.h"
 #include "Contest.h"
@@ -38,24 +39,13 @@ Contender LoadBitmap() {
 }
 
 /// The slices of the volume as images.
-class Study : public IBinaryDataIO {
+class Study : public bench::ImageStudy {
  public:
-  Study() : m_images(kDepth) {}
-
-  void Write(BinaryDataOut& out) override {
-    for (dImage& image : m_images) {
-      out.Write(&image);
-    }
-  }
-  void Read(BinaryDataIn& in) override {
-    for (dImage& image : m_images) {
-      in.Read(&image);
-    }
-  }
+  Study() : ImageStudy(kDepth) {}
 
   void TakeVolume() {
     const std::uint16_t* slice = Volume().data();
-    for (dImage& image : m_images) {
+    for (dImage& image : Images()) {
       image.Init(kWidth, kHeight, ImageDataType_U16, "G", ImageDataOrder_Pixel, 2);
       std::memcpy(image.GetDataPtr(), slice, image.GetImageSize());
       slice += kSliceVoxels;
@@ -63,7 +53,7 @@ class Study : public IBinaryDataIO {
   }
   std::string Check() const {
     const std::uint16_t* slice = Volume().data();
-    for (const dImage& image : m_images) {
+    for (const dImage& image : Images()) {
       if (image.GetNumDataSamples() != kSliceVoxels ||
           std::memcmp(image.GetDataPtr(), slice, image.GetImageSize()) != 0) {
         return "wrong: other pixels";
@@ -72,9 +62,6 @@ class Study : public IBinaryDataIO {
     }
     return "";
   }
-
- private:
-  std::vector<dImage> m_images;
 };
 
 Contender WriteStudy() {
